@@ -1,0 +1,29 @@
+#include "platform/api/Preference.h"
+
+#include <cstdio>
+#include <cstdlib>
+#include <cstring>
+
+#include "platform/sim/SimHost.h"
+
+extern "C" {
+
+// The simulated host's start: it refuses to run against the real machine's
+// root, and loads the host state before the screen starts, so that a bad
+// state file is reported on standard error with exit status 1.
+void Preference_Init() {
+  const char* root = std::getenv("TULK_ROOT");
+  if (root == nullptr || *root == '\0' || std::strcmp(root, "/") == 0) {
+    std::fprintf(stderr,
+                 "tulk: the simulated host needs TULK_ROOT set to a scratch root "
+                 "(scripts/make-demo-root.sh builds one)\n");
+    std::exit(1);
+  }
+  try {
+    Sim::SimHost::Instance().Load();
+  } catch (const Sim::StateError& error) {
+    std::fprintf(stderr, "tulk: %s\n", error.what());
+    std::exit(1);
+  }
+}
+}

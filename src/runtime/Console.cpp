@@ -1,0 +1,115 @@
+#include "runtime/Console.h"
+
+#include <curses.h>
+#include <fcntl.h>
+#include <syslog.h>
+#include <unistd.h>
+#include <clocale>
+#include <cstdlib>
+
+#include "runtime/CaseTables.h"
+#include "runtime/KeyInput.h"
+#include "runtime/KeyTable.h"
+#include "runtime/Palette.h"
+#include "runtime/PidFile.h"
+#include "runtime/SignalThread.h"
+#include "runtime/SystemLog.h"
+#include "runtime/Terminal.h"
+
+namespace Tulk {
+namespace {
+
+void SilenceStandardError() {
+  int fd = open("/dev/null", O_WRONLY | O_CLOEXEC);
+  if (fd < 0) {
+    return;
+  }
+  dup2(fd, 2);
+  close(fd);
+}
+
+void SetLocale() {
+  // en_US.UTF-8 is missing on a fresh machine; C.UTF-8 still gives the
+  // line drawing and block characters.
+  if (std::setlocale(LC_ALL, "en_US.UTF-8") == nullptr) {
+    std::setlocale(LC_ALL, "C.UTF-8");
+  }
+}
+
+void EndWindowAtExit() {
+  endwin();
+}
+
+void StartCurses() {
+  initscr();
+  start_color();
+  std::atexit(EndWindowAtExit);
+  curs_set(0);
+  cbreak();
+  noecho();
+  keypad(stdscr, TRUE);
+  set_escdelay(kEscDelayMs);
+}
+
+}  // namespace
+
+int ConsoleMain(int argc, char** argv, const ConsoleHooks& hooks) {
+  InitCaseTables();
+  if (hooks.preferenceInit) {
+    hooks.preferenceInit();
+  }
+
+  std::optional<int> vt;
+  if (argc > 1) {
+    vt = ParseVtArgument(argv[1]);
+    if (!vt) {
+      Log(LOG_ERR, "Invalid VT specified for TULK: %s", argv[1]);
+    }
+  }
+
+  StartSignalThread();
+
+  SetIdleTimeoutReader(hooks.readIdleTimeout);
+  SetSmartCardCheck(hooks.smartCardCheck);
+  ReloadIdleTimeout();
+
+  SilenceStandardError();
+  SaveTerminalAttributes();
+  ApplyTerminalType(IsLinuxConsole());
+
+  if (hooks.initProductLogging) {
+    hooks.initProductLogging();
+  }
+  OpenSystemLog();
+  Log(LOG_INFO, "Starting TULK");
+
+  WritePidFile();
+
+  if (vt) {
+    SwitchToVt(*vt);
+    DisableSuspendCharacter();
+  }
+
+  SetLocale();
+  StartCurses();
+  InitColors();
+  DefineKeys();
+  refresh();
+
+  if (hooks.afterStartup) {
+    hooks.afterStartup();
+  }
+  if (hooks.runWelcome) {
+    hooks.runWelcome();
+  }
+
+  erase();
+  refresh();
+  endwin();
+  static const char kPaletteReset[] = "\x1b]R";
+  ssize_t written = write(1, kPaletteReset, 3);
+  (void)written;
+  return 0;
+}
+
+}  // namespace Tulk
