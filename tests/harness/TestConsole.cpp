@@ -1,0 +1,385 @@
+#include "TestConsole.h"
+
+#include <fcntl.h>
+#include <poll.h>
+#include <pty.h>
+#include <signal.h>
+#include <sys/ioctl.h>
+#include <sys/wait.h>
+#include <unistd.h>
+
+#include <cerrno>
+#include <cstring>
+#include <fstream>
+#include <set>
+#include <sstream>
+#include <stdexcept>
+
+#include "KeyNames.h"
+
+extern char** environ;
+
+namespace TulkTest {
+namespace {
+
+using Clock = std::chrono::steady_clock;
+
+std::filesystem::path MakeFolder() {
+  std::string pattern = (std::filesystem::temp_directory_path() / "tulk-test-XXXXXX").string();
+  if (mkdtemp(pattern.data()) == nullptr) {
+    throw std::runtime_error("mkdtemp failed: " + std::string(std::strerror(errno)));
+  }
+  return pattern;
+}
+
+void RunToCompletion(const std::vector<std::string>& argv) {
+  pid_t pid = fork();
+  if (pid == 0) {
+    std::vector<char*> args;
+    for (const std::string& arg : argv) {
+      args.push_back(const_cast<char*>(arg.c_str()));
+    }
+    args.push_back(nullptr);
+    execv(args[0], args.data());
+    _exit(127);
+  }
+  int status = 0;
+  while (pid > 0 && waitpid(pid, &status, 0) < 0 && errno == EINTR) {
+  }
+  if (pid < 0 || !WIFEXITED(status) || WEXITSTATUS(status) != 0) {
+    throw std::runtime_error("failed to run " + argv[0]);
+  }
+}
+
+}  // namespace
+
+std::string TulkBinary() { return TULK_TEST_TULK_BINARY; }
+
+std::string HostToolBinary() { return TULK_TEST_HOSTTOOL_BINARY; }
+
+TestConsole::TestConsole(Options options) : options_(std::move(options)) {
+  folder_ = MakeFolder();
+  root_ = folder_ / "root";
+  logPath_ = folder_ / "syslog.txt";
+  for (const char* sub : {"var/run", "var/log", "etc", "tmp"}) {
+    std::filesystem::create_directories(root_ / sub);
+  }
+  std::string tool = HostToolBinary();
+  if (options_.hostTools && !tool.empty() && std::filesystem::exists(tool)) {
+    RunToCompletion({tool, "--install", root_.string()});
+  }
+  if (options_.hostState) {
+    std::ofstream(HostStatePath()) << *options_.hostState;
+  }
+  if (options_.prepareRoot) {
+    options_.prepareRoot(root_);
+  }
+  terminal_ = std::make_unique<VirtualTerminal>(options_.rows, options_.cols);
+  if (options_.start) {
+    Start();
+  }
+}
+
+TestConsole::~TestConsole() {
+  if (Running()) {
+    kill(pid_, SIGKILL);
+    Reap(true);
+  }
+  if (master_ >= 0) {
+    close(master_);
+  }
+  if (std::getenv("TULK_KEEP_TEST_ROOT") == nullptr) {
+    std::error_code ignored;
+    std::filesystem::remove_all(folder_, ignored);
+  }
+}
+
+std::vector<std::string> TestConsole::BuildEnvironment() const {
+  std::map<std::string, std::string> env;
+  for (char** entry = environ; *entry != nullptr; ++entry) {
+    std::string text = *entry;
+    auto equals = text.find('=');
+    if (equals != std::string::npos) {
+      env[text.substr(0, equals)] = text.substr(equals + 1);
+    }
+  }
+  for (const char* name : {"TULK_ROOT", "TULK_HOST_STATE", "TULK_LOG_FILE", "TULK_TIME_SCALE",
+                           "SSH_CLIENT", "TERMINFO", "TULK_SIM_DEMO_FILE", "LESSSECURE"}) {
+    env.erase(name);
+  }
+  env["TULK_ROOT"] = root_.string();
+  env["TULK_LOG_FILE"] = logPath_.string();
+  env["TMPDIR"] = folder_.string();
+  if (options_.term.empty()) {
+    env.erase("TERM");
+  } else {
+    env["TERM"] = options_.term;
+  }
+  if (options_.hostState) {
+    env["TULK_HOST_STATE"] = HostStatePath().string();
+  }
+  if (options_.timeScale > 0) {
+    std::ostringstream scale;
+    scale << options_.timeScale;
+    env["TULK_TIME_SCALE"] = scale.str();
+  }
+  for (const auto& [name, value] : options_.env) {
+    env[name] = value;
+  }
+  for (const std::string& name : options_.unsetEnv) {
+    env.erase(name);
+  }
+  std::vector<std::string> result;
+  for (const auto& [name, value] : env) {
+    result.push_back(name + "=" + value);
+  }
+  return result;
+}
+
+void TestConsole::Start() {
+  std::string program = options_.program.empty() ? TulkBinary() : options_.program;
+  std::vector<std::string> argv{program};
+  argv.insert(argv.end(), options_.args.begin(), options_.args.end());
+  std::vector<std::string> env = BuildEnvironment();
+
+  winsize size{};
+  size.ws_row = static_cast<unsigned short>(options_.rows);
+  size.ws_col = static_cast<unsigned short>(options_.cols);
+  pid_ = forkpty(&master_, nullptr, nullptr, &size);
+  if (pid_ < 0) {
+    throw std::runtime_error("forkpty failed: " + std::string(std::strerror(errno)));
+  }
+  if (pid_ == 0) {
+    close_range(3, ~0U, 0);
+    sigset_t none;
+    sigemptyset(&none);
+    sigprocmask(SIG_SETMASK, &none, nullptr);
+    std::vector<char*> args;
+    for (const std::string& arg : argv) {
+      args.push_back(const_cast<char*>(arg.c_str()));
+    }
+    args.push_back(nullptr);
+    std::vector<char*> envp;
+    for (const std::string& entry : env) {
+      envp.push_back(const_cast<char*>(entry.c_str()));
+    }
+    envp.push_back(nullptr);
+    chdir(folder_.c_str());
+    execve(args[0], args.data(), envp.data());
+    _exit(127);
+  }
+  fcntl(master_, F_SETFL, fcntl(master_, F_GETFL) | O_NONBLOCK);
+  fcntl(master_, F_SETFD, FD_CLOEXEC);
+}
+
+void TestConsole::Key(std::string_view name, int times) {
+  std::string bytes = KeyBytes(name);
+  for (int i = 0; i < times; ++i) {
+    Send(bytes);
+  }
+}
+
+void TestConsole::Type(std::string_view text) { Send(text); }
+
+void TestConsole::Send(std::string_view bytes) {
+  while (!bytes.empty()) {
+    ssize_t written = write(master_, bytes.data(), bytes.size());
+    if (written < 0) {
+      if (errno == EAGAIN || errno == EINTR) {
+        Pump(10ms);
+        continue;
+      }
+      return;
+    }
+    bytes.remove_prefix(static_cast<std::size_t>(written));
+  }
+}
+
+void TestConsole::Signal(int signal) {
+  if (Running()) {
+    kill(pid_, signal);
+  }
+}
+
+void TestConsole::Resize(int cols, int rows) {
+  winsize size{};
+  size.ws_row = static_cast<unsigned short>(rows);
+  size.ws_col = static_cast<unsigned short>(cols);
+  ioctl(master_, TIOCSWINSZ, &size);
+  terminal_->Resize(rows, cols);
+}
+
+void TestConsole::Pump(Millis timeout) {
+  if (master_ < 0) {
+    return;
+  }
+  auto deadline = Clock::now() + timeout;
+  for (;;) {
+    auto left = std::chrono::duration_cast<Millis>(deadline - Clock::now());
+    pollfd fd{master_, POLLIN, 0};
+    int ready = poll(&fd, 1, static_cast<int>(std::max<long>(left.count(), 0)));
+    if (ready <= 0) {
+      return;
+    }
+    char buffer[8192];
+    ssize_t got = read(master_, buffer, sizeof buffer);
+    if (got <= 0) {
+      if (got < 0 && (errno == EAGAIN || errno == EINTR)) {
+        continue;
+      }
+      return;  // EIO: the program closed the terminal
+    }
+    bytesReceived_ += static_cast<std::size_t>(got);
+    terminal_->Write(std::string_view(buffer, static_cast<std::size_t>(got)));
+    std::string replies = terminal_->TakeReplies();
+    if (!replies.empty()) {
+      Send(replies);
+    }
+    // Keep reading what is already there, without waiting any longer.
+    deadline = std::min(deadline, Clock::now());
+  }
+}
+
+::testing::AssertionResult TestConsole::WaitForText(std::string_view text, Millis timeout) {
+  auto deadline = Clock::now() + timeout;
+  for (;;) {
+    Pump(0ms);
+    if (Contains(text)) {
+      return ::testing::AssertionSuccess();
+    }
+    if (Clock::now() >= deadline) {
+      return ::testing::AssertionFailure()
+             << "\"" << text << "\" did not appear within " << timeout.count() << " ms\n"
+             << Dump();
+    }
+    Pump(20ms);
+  }
+}
+
+::testing::AssertionResult TestConsole::WaitForTextGone(std::string_view text, Millis timeout) {
+  auto deadline = Clock::now() + timeout;
+  for (;;) {
+    Pump(0ms);
+    if (!Contains(text)) {
+      return ::testing::AssertionSuccess();
+    }
+    if (Clock::now() >= deadline) {
+      return ::testing::AssertionFailure() << "\"" << text << "\" still shown after "
+                                           << timeout.count() << " ms\n"
+                                           << Dump();
+    }
+    Pump(20ms);
+  }
+}
+
+::testing::AssertionResult TestConsole::WaitForLog(std::string_view text, Millis timeout) {
+  auto deadline = Clock::now() + timeout;
+  for (;;) {
+    for (const std::string& line : LogLines()) {
+      if (line.find(text) != std::string::npos) {
+        return ::testing::AssertionSuccess();
+      }
+    }
+    if (Clock::now() >= deadline) {
+      std::ostringstream lines;
+      for (const std::string& line : LogLines()) {
+        lines << "  " << line << "\n";
+      }
+      return ::testing::AssertionFailure() << "no log line with \"" << text << "\" within "
+                                           << timeout.count() << " ms; the log holds:\n"
+                                           << lines.str() << Dump();
+    }
+    Pump(20ms);
+  }
+}
+
+void TestConsole::WaitQuiet(Millis quiet, Millis timeout) {
+  auto deadline = Clock::now() + timeout;
+  while (Clock::now() < deadline) {
+    std::size_t before = bytesReceived_;
+    Pump(quiet);
+    if (bytesReceived_ == before) {
+      return;
+    }
+  }
+}
+
+void TestConsole::Reap(bool block) {
+  if (pid_ <= 0 || exitStatus_) {
+    return;
+  }
+  int status = 0;
+  pid_t done;
+  do {
+    done = waitpid(pid_, &status, block ? 0 : WNOHANG);
+  } while (done < 0 && errno == EINTR);
+  if (done == pid_) {
+    exitStatus_ = WIFEXITED(status) ? WEXITSTATUS(status) : 128 + WTERMSIG(status);
+  }
+}
+
+std::optional<int> TestConsole::WaitExit(Millis timeout) {
+  auto deadline = Clock::now() + timeout;
+  for (;;) {
+    Pump(0ms);
+    Reap(false);
+    if (exitStatus_) {
+      Pump(0ms);
+      return exitStatus_;
+    }
+    if (Clock::now() >= deadline) {
+      return std::nullopt;
+    }
+    Pump(10ms);
+  }
+}
+
+std::string TestConsole::Row(int row) const { return terminal_->Row(row); }
+
+std::string TestConsole::Screen() const {
+  std::string text;
+  for (int row = 0; row < terminal_->Rows(); ++row) {
+    text += terminal_->Row(row);
+    text += '\n';
+  }
+  return text;
+}
+
+bool TestConsole::Contains(std::string_view text) const {
+  for (int row = 0; row < terminal_->Rows(); ++row) {
+    if (terminal_->Row(row).find(text) != std::string::npos) {
+      return true;
+    }
+  }
+  return false;
+}
+
+Cell TestConsole::At(int row, int col) const { return terminal_->At(row, col); }
+
+CursorState TestConsole::Cursor() const { return terminal_->Cursor(); }
+
+std::string TestConsole::Dump() const {
+  std::ostringstream out;
+  CursorState cursor = terminal_->Cursor();
+  out << "screen " << terminal_->Cols() << "x" << terminal_->Rows() << ", cursor at row "
+      << cursor.row << " col " << cursor.col << (cursor.visible ? " (visible)" : " (hidden)")
+      << ":\n";
+  for (int row = 0; row < terminal_->Rows(); ++row) {
+    char number[16];
+    std::snprintf(number, sizeof number, "%2d|", row);
+    out << number << terminal_->Row(row) << "|\n";
+  }
+  return out.str();
+}
+
+std::vector<std::string> TestConsole::LogLines() const {
+  std::vector<std::string> lines;
+  std::ifstream in(logPath_);
+  std::string line;
+  while (std::getline(in, line)) {
+    lines.push_back(line);
+  }
+  return lines;
+}
+
+}  // namespace TulkTest
