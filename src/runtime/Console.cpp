@@ -36,8 +36,12 @@ void SetLocale() {
   }
 }
 
+// Every exit() restores the terminal; after the normal teardown curses has
+// already ended and nothing more may follow the palette reset.
 void EndWindowAtExit() {
-  endwin();
+  if (stdscr != nullptr && !isendwin()) {
+    endwin();
+  }
 }
 
 void StartCurses() {

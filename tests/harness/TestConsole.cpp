@@ -53,9 +53,13 @@ void RunToCompletion(const std::vector<std::string>& argv) {
 
 }  // namespace
 
-std::string TulkBinary() { return TULK_TEST_TULK_BINARY; }
+std::string TulkBinary() {
+  return TULK_TEST_TULK_BINARY;
+}
 
-std::string HostToolBinary() { return TULK_TEST_HOSTTOOL_BINARY; }
+std::string HostToolBinary() {
+  return TULK_TEST_HOSTTOOL_BINARY;
+}
 
 TestConsole::TestConsole(Options options) : options_(std::move(options)) {
   folder_ = MakeFolder();
@@ -179,7 +183,9 @@ void TestConsole::Key(std::string_view name, int times) {
   }
 }
 
-void TestConsole::Type(std::string_view text) { Send(text); }
+void TestConsole::Type(std::string_view text) {
+  Send(text);
+}
 
 void TestConsole::Send(std::string_view bytes) {
   while (!bytes.empty()) {
@@ -230,6 +236,9 @@ void TestConsole::Pump(Millis timeout) {
       return;  // EIO: the program closed the terminal
     }
     bytesReceived_ += static_cast<std::size_t>(got);
+    if (options_.keepOutput) {
+      output_.append(buffer, static_cast<std::size_t>(got));
+    }
     terminal_->Write(std::string_view(buffer, static_cast<std::size_t>(got)));
     std::string replies = terminal_->TakeReplies();
     if (!replies.empty()) {
@@ -264,9 +273,9 @@ void TestConsole::Pump(Millis timeout) {
       return ::testing::AssertionSuccess();
     }
     if (Clock::now() >= deadline) {
-      return ::testing::AssertionFailure() << "\"" << text << "\" still shown after "
-                                           << timeout.count() << " ms\n"
-                                           << Dump();
+      return ::testing::AssertionFailure()
+             << "\"" << text << "\" still shown after " << timeout.count() << " ms\n"
+             << Dump();
     }
     Pump(20ms);
   }
@@ -334,7 +343,17 @@ std::optional<int> TestConsole::WaitExit(Millis timeout) {
   }
 }
 
-std::string TestConsole::Row(int row) const { return terminal_->Row(row); }
+std::optional<termios> TestConsole::TerminalAttributes() const {
+  termios attributes{};
+  if (master_ < 0 || tcgetattr(master_, &attributes) != 0) {
+    return std::nullopt;
+  }
+  return attributes;
+}
+
+std::string TestConsole::Row(int row) const {
+  return terminal_->Row(row);
+}
 
 std::string TestConsole::Screen() const {
   std::string text;
@@ -354,9 +373,13 @@ bool TestConsole::Contains(std::string_view text) const {
   return false;
 }
 
-Cell TestConsole::At(int row, int col) const { return terminal_->At(row, col); }
+Cell TestConsole::At(int row, int col) const {
+  return terminal_->At(row, col);
+}
 
-CursorState TestConsole::Cursor() const { return terminal_->Cursor(); }
+CursorState TestConsole::Cursor() const {
+  return terminal_->Cursor();
+}
 
 std::string TestConsole::Dump() const {
   std::ostringstream out;

@@ -17,6 +17,7 @@
 
 #include <gtest/gtest.h>
 #include <sys/types.h>
+#include <termios.h>
 
 #include <chrono>
 #include <filesystem>
@@ -59,6 +60,8 @@ struct Options {
   std::function<void(const std::filesystem::path& root)> prepareRoot;
   /// Start the program in the constructor.
   bool start = true;
+  /// Keep every byte the program writes (Output()).
+  bool keepOutput = false;
 };
 
 class TestConsole {
@@ -115,6 +118,10 @@ class TestConsole {
   std::filesystem::path HostStatePath() const { return folder_ / "host-state.json"; }
   /// Every byte the program wrote to the terminal so far.
   std::size_t BytesReceived() const { return bytesReceived_; }
+  /// The raw bytes the program wrote (kept when options.keepOutput).
+  const std::string& Output() const { return output_; }
+  /// The terminal's current attributes (as the program left them).
+  std::optional<termios> TerminalAttributes() const;
   pid_t Pid() const { return pid_; }
   bool Running() const { return pid_ > 0 && !exitStatus_; }
 
@@ -131,6 +138,7 @@ class TestConsole {
   pid_t pid_ = -1;
   std::optional<int> exitStatus_;
   std::size_t bytesReceived_ = 0;
+  std::string output_;
 };
 
 /// Path of the tulk binary of this build.

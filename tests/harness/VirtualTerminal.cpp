@@ -65,7 +65,9 @@ VirtualTerminal::VirtualTerminal(int rows, int cols)
   vterm_screen_reset(screen_, 1);
 }
 
-VirtualTerminal::~VirtualTerminal() { vterm_free(vt_); }
+VirtualTerminal::~VirtualTerminal() {
+  vterm_free(vt_);
+}
 
 void VirtualTerminal::Write(std::string_view bytes) {
   vterm_input_write(vt_, bytes.data(), bytes.size());

@@ -1,0 +1,65 @@
+#include "runtime/KeyTable.h"
+
+#include <curses.h>
+#include <gtest/gtest.h>
+
+#include <map>
+#include <set>
+#include <string>
+
+namespace {
+
+std::map<std::string, int> TableAsMap() {
+  std::map<std::string, int> table;
+  for (const Tulk::KeySequence& entry : Tulk::KeySequences()) {
+    table.emplace(entry.sequence, entry.key);
+  }
+  return table;
+}
+
+TEST(KeyTable, MapsTheTerminalSequences) {
+  std::map<std::string, int> table = TableAsMap();
+  EXPECT_EQ(table.at("\x1bOX"), KEY_F(9));
+  EXPECT_EQ(table.at("\x1bOY"), KEY_F(12));
+  EXPECT_EQ(table.at("\x1b[11~"), KEY_F(1));
+  EXPECT_EQ(table.at("\x1b!"), KEY_F(11));
+  EXPECT_EQ(table.at("\x1b@"), KEY_F(12));
+  EXPECT_EQ(table.at("\x1b"
+                     "0"),
+            KEY_F(10));
+  EXPECT_EQ(table.at("\x1b[X"), KEY_F(12));
+  EXPECT_EQ(table.at("\x1bR"), KEY_RESIZE);
+  EXPECT_EQ(table.at("\x1b?"), KEY_PPAGE);
+  EXPECT_EQ(table.at("\x1b/"), KEY_NPAGE);
+  EXPECT_EQ(table.at("\x7f"), KEY_BACKSPACE);
+}
+
+TEST(KeyTable, EveryRowIsUniqueAndStartsWithEscapeButBackspace) {
+  std::set<std::string> seen;
+  for (const Tulk::KeySequence& entry : Tulk::KeySequences()) {
+    std::string sequence = entry.sequence;
+    EXPECT_TRUE(seen.insert(sequence).second) << "duplicate sequence";
+    if (sequence != "\x7f") {
+      EXPECT_EQ(sequence.front(), '\x1b');
+    }
+  }
+  EXPECT_EQ(seen.size(), 68u);
+}
+
+TEST(KeyTable, EscOGroupHasNoF10OrF11) {
+  for (const Tulk::KeySequence& entry : Tulk::KeySequences()) {
+    std::string sequence = entry.sequence;
+    if (sequence.size() == 3 && sequence.compare(0, 2, "\x1bO") == 0) {
+      EXPECT_NE(entry.key, KEY_F(10)) << sequence;
+      EXPECT_NE(entry.key, KEY_F(11)) << sequence;
+    }
+  }
+}
+
+TEST(KeyTable, RegistrationOrderStartsWithResizeAndEndsWithBackspace) {
+  auto table = Tulk::KeySequences();
+  EXPECT_STREQ(table.front().sequence, "\x1bR");
+  EXPECT_STREQ(table.back().sequence, "\x7f");
+}
+
+}  // namespace
