@@ -1,0 +1,46 @@
+#!/usr/bin/env bash
+# Installs what is missing, builds, and runs the whole test suite:
+#   1. default build (warnings as errors): unit and screen tests;
+#   2. sanitizer build (AddressSanitizer + UndefinedBehaviorSanitizer): the
+#      same tests again;
+#   3. a short libFuzzer run of every fuzz target (60 s each when CI=true,
+#      10 s otherwise; TULK_FUZZ_SECONDS overrides).
+# Options: --no-asan and --no-fuzz skip steps 2 and 3 (for quick local runs).
+set -euo pipefail
+cd "$(dirname "$0")/.."
+
+run_asan=1
+run_fuzz=1
+for argument in "$@"; do
+  case "$argument" in
+    --no-asan) run_asan=0 ;;
+    --no-fuzz) run_fuzz=0 ;;
+    *) echo "usage: scripts/test.sh [--no-asan] [--no-fuzz]" >&2; exit 2 ;;
+  esac
+done
+
+scripts/setup.sh
+jobs=$(nproc)
+
+echo "== default build: unit and screen tests"
+scripts/build.sh default
+ctest --preset default -j "$jobs"
+
+if ((run_asan)); then
+  echo "== sanitizer build (ASan + UBSan): unit and screen tests"
+  scripts/build.sh asan
+  ASAN_OPTIONS=detect_leaks=1:abort_on_error=1 UBSAN_OPTIONS=print_stacktrace=1:halt_on_error=1 \
+    ctest --preset asan -j "$jobs"
+fi
+
+if ((run_fuzz)) && [[ -x scripts/run-fuzzers.sh ]]; then
+  if [[ ${CI:-} == true ]]; then
+    seconds=${TULK_FUZZ_SECONDS:-60}
+  else
+    seconds=${TULK_FUZZ_SECONDS:-10}
+  fi
+  echo "== fuzzing, ${seconds} s per target"
+  scripts/run-fuzzers.sh "$seconds"
+fi
+
+echo "== all tests passed"
