@@ -1,0 +1,24 @@
+#pragma once
+/// The measured scenarios of the console benchmark.
+
+#include <string>
+#include <vector>
+
+namespace TulkBench {
+
+struct BenchSettings {
+  int runs = 20;
+  int idleSeconds = 10;
+};
+
+/// One measured figure with its samples.
+struct Figure {
+  std::string name;
+  std::string unit;
+  std::vector<double> values;
+};
+
+/// Runs every scenario and returns its figures in a fixed order.
+std::vector<Figure> RunScenarios(const BenchSettings& settings);
+
+}  // namespace TulkBench
