@@ -6,6 +6,8 @@
 
 namespace HykCtl::Adv {
 
+/// Reads the host's advanced options. Every operation may throw
+/// HostMgr::Lib::HostMgrException.
 class UserAdvancedOptionImpl {
  public:
   /// The integer value of the option. Throws HostMgr::Lib::HostMgrException
@@ -13,6 +15,9 @@ class UserAdvancedOptionImpl {
   std::int64_t GetUserOption(const std::string& path) const;
   /// Whether the option exists.
   bool HasUserOption(const std::string& path) const;
+  /// Sets (or creates) the option. The console changes options through
+  /// the host's command-line tool; this is the library's own way in.
+  void SetUserOption(const std::string& path, std::int64_t value);
 };
 
 }  // namespace HykCtl::Adv

@@ -23,4 +23,11 @@ bool UserAdvancedOptionImpl::HasUserOption(const std::string& path) const {
   return options.contains(path);
 }
 
+void UserAdvancedOptionImpl::SetUserOption(const std::string& path, std::int64_t value) {
+  Sim::SimHost& host = Sim::SimHost::Instance();
+  host.CheckFault("HykCtl::Adv::UserAdvancedOptionImpl::SetUserOption");
+  host.State()["advancedOptions"][path] = value;
+  host.Save();
+}
+
 }  // namespace HykCtl::Adv
