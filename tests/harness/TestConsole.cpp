@@ -75,6 +75,9 @@ TestConsole::TestConsole(Options options) : options_(std::move(options)) {
   if (options_.hostState) {
     std::ofstream(HostStatePath()) << *options_.hostState;
   }
+  if (!options_.pamUsers.empty()) {
+    WritePamServices();
+  }
   if (options_.prepareRoot) {
     options_.prepareRoot(root_);
   }
@@ -127,6 +130,17 @@ std::vector<std::string> TestConsole::BuildEnvironment() const {
     scale << options_.timeScale;
     env["TULK_TIME_SCALE"] = scale.str();
   }
+  if (!options_.pamUsers.empty()) {
+    env["LD_PRELOAD"] = TULK_TEST_PAM_WRAPPER_LIBRARY;
+    env["PAM_WRAPPER"] = "1";
+    env["PAM_WRAPPER_SERVICE_DIR"] = (folder_ / "pam").string();
+#ifdef TULK_TEST_SANITIZED
+    // The sanitizer runtime cannot come first when a library is preloaded.
+    env["PAM_WRAPPER_DISABLE_DEEPBIND"] = "1";
+    std::string asan = env.count("ASAN_OPTIONS") != 0 ? env["ASAN_OPTIONS"] + ":" : "";
+    env["ASAN_OPTIONS"] = asan + "verify_asan_link_order=0";
+#endif
+  }
   for (const auto& [name, value] : options_.env) {
     env[name] = value;
   }
@@ -138,6 +152,36 @@ std::vector<std::string> TestConsole::BuildEnvironment() const {
     result.push_back(name + "=" + value);
   }
   return result;
+}
+
+void TestConsole::WritePamServices() {
+  std::filesystem::path services = folder_ / "pam";
+  std::filesystem::create_directories(services);
+  {
+    std::ofstream passdb(services / "passdb");
+    for (const auto& [user, password] : options_.pamUsers) {
+      passdb << user << ":" << password << ":tulk\n";
+    }
+  }
+  {
+    std::ofstream policy(services / "policy");
+    for (const std::string& line : options_.pamPolicy) {
+      policy << line << "\n";
+    }
+  }
+  const std::string matrix =
+      std::string(TULK_TEST_PAM_MATRIX_MODULE) + " passdb=" + (services / "passdb").string();
+  const std::string policy =
+      std::string(TULK_TEST_PAM_POLICY_MODULE) + " policy=" + (services / "policy").string();
+  for (const char* service : {"tulk", "other"}) {
+    std::ofstream file(services / service);
+    file << "auth     required  " << matrix << "\n"
+         << "account  requisite " << policy << "\n"
+         << "account  required  " << matrix << "\n"
+         << "password requisite " << policy << "\n"
+         << "password required  " << matrix << "\n"
+         << "session  required  " << matrix << "\n";
+  }
 }
 
 void TestConsole::Start() {

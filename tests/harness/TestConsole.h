@@ -62,6 +62,13 @@ struct Options {
   bool start = true;
   /// Keep every byte the program writes (Output()).
   bool keepOutput = false;
+  /// Console logins through the real PAM library: pam_wrapper preloaded,
+  /// a "tulk" service of pam_matrix with these users (name → password), and
+  /// the test policy module before it. Empty: no PAM set-up.
+  std::map<std::string, std::string> pamUsers;
+  /// Lines "user:outcome" for the test policy module: "expired",
+  /// "denied", "chauthtok-fails".
+  std::vector<std::string> pamPolicy;
 };
 
 class TestConsole {
@@ -114,6 +121,8 @@ class TestConsole {
   std::vector<std::string> LogLines() const;
   /// The host root of this test.
   const std::filesystem::path& Root() const { return root_; }
+  /// The pam_matrix password file (passwords changed through PAM land here).
+  std::filesystem::path PamPasswordFile() const { return folder_ / "pam" / "passdb"; }
   /// The host state file (the demo host's private copy when none was given).
   std::filesystem::path HostStatePath() const { return folder_ / "host-state.json"; }
   /// Every byte the program wrote to the terminal so far.
@@ -127,6 +136,7 @@ class TestConsole {
 
  private:
   void Reap(bool block);
+  void WritePamServices();
   std::vector<std::string> BuildEnvironment() const;
 
   Options options_;
