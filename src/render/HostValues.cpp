@@ -26,8 +26,12 @@ const ValueProvider* FindValueProvider(std::string_view key) {
   return found == Providers().end() ? nullptr : &found->second;
 }
 
-void SetVersionLineSource(VersionLineSource source) { VersionSource() = std::move(source); }
+void SetVersionLineSource(VersionLineSource source) {
+  VersionSource() = std::move(source);
+}
 
-const VersionLineSource& GetVersionLineSource() { return VersionSource(); }
+const VersionLineSource& GetVersionLineSource() {
+  return VersionSource();
+}
 
 }  // namespace Tulk

@@ -1,0 +1,136 @@
+#include "render/MarkupPainter.h"
+
+#include <algorithm>
+#include <string>
+
+#include "include/ColorNumbers.h"
+#include "render/MarkupTag.h"
+#include "runtime/Palette.h"
+
+namespace Tulk {
+namespace {
+
+class Painter {
+ public:
+  Painter(WINDOW* window, const PaintStyle& style, const ColorTable& colors)
+      : window_(window),
+        style_(style),
+        colors_(colors),
+        height_(getmaxy(window)),
+        width_(getmaxx(window)),
+        foreground_(style.foreground),
+        background_(style.background) {}
+
+  void Run(std::string_view text) {
+    SetWindowAttribute(window_, style_.active ? ColorAttr(style_.background, style_.foreground)
+                                              : ColorAttr(kBlack, kDarkGrey));
+    std::size_t i = 0;
+    while (i < text.size()) {
+      char c = text[i];
+      if (c == '{') {
+        std::size_t close = text.find('}', i + 1);
+        if (close == std::string_view::npos) {
+          break;
+        }
+        Tag(text.substr(i + 1, close - i - 1));
+        i = close + 1;
+        continue;
+      }
+      if (c == '\n') {
+        Flush();
+        if (row_ + 1 >= height_) {
+          return;
+        }
+        ++row_;
+        column_ = 0;
+      } else {
+        unsigned char byte = static_cast<unsigned char>(c);
+        pending_ += (byte < 0x20 || byte == 0x7f) ? ' ' : c;
+      }
+      ++i;
+    }
+    Flush();
+  }
+
+ private:
+  void Flush() {
+    if (pending_.empty()) {
+      return;
+    }
+    int length = static_cast<int>(std::min<std::size_t>(pending_.size(), 1 << 20));
+    int fits = std::min(length, width_ - column_);
+    if (row_ < height_ && fits > 0 && wmove(window_, row_, column_) != ERR) {
+      waddnstr(window_, pending_.data(), fits);
+    }
+    column_ += length;
+    pending_.clear();
+  }
+
+  void Restore() {
+    if (style_.active) {
+      SetWindowAttribute(window_, ColorAttr(style_.background, style_.foreground));
+    }
+    foreground_ = style_.foreground;
+    background_ = style_.background;
+    colorInForce_ = false;
+    backgroundInForce_ = false;
+  }
+
+  void Tag(std::string_view text) {
+    if (text.empty()) {
+      return;
+    }
+    MarkupTag tag = MarkupTag::Split(text);
+    bool color = tag.name == "color";
+    bool background = tag.name == "bgcolor";
+    bool endColor = tag.name == "/color";
+    bool endBackground = tag.name == "/bgcolor";
+    if (!color && !background && !endColor && !endBackground) {
+      return;
+    }
+    Flush();
+    if (color || background) {
+      std::optional<int> number = tag.hasValue ? colors_.Find(tag.value) : std::nullopt;
+      if (!number) {
+        return;
+      }
+      if (color) {
+        foreground_ = *number;
+        colorInForce_ = true;
+      } else {
+        background_ = *number;
+        backgroundInForce_ = true;
+      }
+      if (style_.active) {
+        SetWindowAttribute(window_, ColorAttr(background_, foreground_));
+      }
+    } else if ((endColor && colorInForce_) || (endBackground && backgroundInForce_)) {
+      Restore();
+    }
+  }
+
+  WINDOW* window_;
+  const PaintStyle& style_;
+  const ColorTable& colors_;
+  const int height_;
+  const int width_;
+  int row_ = 0;
+  int column_ = 0;
+  std::string pending_;
+  int foreground_;
+  int background_;
+  bool colorInForce_ = false;
+  bool backgroundInForce_ = false;
+};
+
+}  // namespace
+
+void PaintMarkup(WINDOW* window, std::string_view laidOut, const PaintStyle& style,
+                 const ColorTable& colors) {
+  if (window == nullptr) {
+    return;
+  }
+  Painter(window, style, colors).Run(laidOut);
+}
+
+}  // namespace Tulk
