@@ -7,7 +7,8 @@ HykNicInfo::HykNicInfo(std::string name, std::string mac, std::string portset,
     : name_(std::move(name)),
       mac_(std::move(mac)),
       portset_(std::move(portset)),
-      portgroup_(std::move(portgroup)) {}
+      portgroup_(std::move(portgroup)) {
+}
 
 std::string HykNicInfo::Heading() const {
   return "  {align:padding:8}Name{/align}{align:padding:19}MAC Address{/align}"
@@ -20,9 +21,13 @@ std::string HykNicInfo::Row() const {
          "{/align}{align:padding:20}" + Shorten(portgroup_, 18) + "{/align}";
 }
 
-std::string HykNicInfo::DetailsTitle() const { return "Hykernel NIC Details"; }
+std::string HykNicInfo::DetailsTitle() const {
+  return "Hykernel NIC Details";
+}
 
-std::string HykNicInfo::NameLine() const { return "Hykernel NIC Name: " + name_; }
+std::string HykNicInfo::NameLine() const {
+  return "Hykernel NIC Name: " + name_;
+}
 
 std::string HykNicInfo::DetailsText() const {
   return "Name: " + name_ + "\nMAC Address: " + mac_ + "\nPortset: " + portset_ +

@@ -2,12 +2,13 @@
 
 namespace Tulk {
 
-PortGroupInfo::PortGroupInfo(std::string name, std::string virtualSwitch,
-                             std::string activeClients, std::string vlanId)
+PortGroupInfo::PortGroupInfo(std::string name, std::string virtualSwitch, std::string activeClients,
+                             std::string vlanId)
     : name_(std::move(name)),
       virtualSwitch_(std::move(virtualSwitch)),
       activeClients_(std::move(activeClients)),
-      vlanId_(std::move(vlanId)) {}
+      vlanId_(std::move(vlanId)) {
+}
 
 std::string PortGroupInfo::Heading() const {
   return "  {align:padding:20}Portgroup Name{/align}{align:padding:16}Virtual Switch{/align}"
@@ -20,9 +21,13 @@ std::string PortGroupInfo::Row() const {
          "{/align}{align:padding:7}" + vlanId_ + "{/align}";
 }
 
-std::string PortGroupInfo::DetailsTitle() const { return "Portgroup Details"; }
+std::string PortGroupInfo::DetailsTitle() const {
+  return "Portgroup Details";
+}
 
-std::string PortGroupInfo::NameLine() const { return "Portgroup Name: " + name_; }
+std::string PortGroupInfo::NameLine() const {
+  return "Portgroup Name: " + name_;
+}
 
 std::string PortGroupInfo::DetailsText() const {
   return "Name: " + name_ + "\nVirtual Switch: " + virtualSwitch_ +

@@ -1,0 +1,51 @@
+#pragma once
+/// An editable field: a label on the left and a bracketed box on the
+/// right, "Login Name:            [ root                          ]".
+///
+/// The field is `width` columns wide (-1: half the row width minus 1) and
+/// scrolls when the value is longer. It is pristine after construction,
+/// after SetValue() and whenever it gains or loses focus: the first editing
+/// key then replaces the whole value (InputField.h lists the keys). While
+/// it is the current row, a pristine value shows black on white (as if
+/// selected whole) and an edited one white on black. Drawing moves the
+/// terminal cursor to the field's cursor; the dialog decides whether the
+/// cursor is shown (Window::ShowCursor).
+
+#include <string>
+
+#include "toolkit/InputField.h"
+#include "toolkit/Item.h"
+
+namespace Tulk {
+
+class InputItem : public Item {
+ public:
+  InputItem(std::string label, std::string value, int width);
+
+  /// Applies an editing key; the dialog redraws the list afterwards.
+  void HandleKey(int key);
+
+  /// Assigns the value: pristine again, cursor at the end.
+  void SetValue(std::string value);
+  const std::string& Value() const { return field_.value; }
+  void SetLabel(std::string label) { label_ = std::move(label); }
+  const std::string& Label() const { return label_; }
+  /// Shows the value as asterisks (passwords).
+  void SetMasked(bool masked) { masked_ = masked; }
+  bool Masked() const { return masked_; }
+  int Width() const { return width_; }
+  const InputField& Field() const { return field_; }
+
+  void Draw(TextArea& area) override;
+
+ protected:
+  void FocusChanged() override;
+
+ private:
+  std::string label_;
+  int width_;
+  bool masked_ = false;
+  InputField field_;
+};
+
+}  // namespace Tulk

@@ -1,0 +1,26 @@
+#include "toolkit/NotificationDialog.h"
+
+#include "include/Keys.h"
+
+namespace Tulk {
+
+NotificationDialog::NotificationDialog(Frame* owner, std::string title, std::string message,
+                                       int width, int height, int headerHeight)
+    : Dialog(owner, width, height, headerHeight),
+      title_(std::move(title)),
+      message_(std::move(message)) {
+  SetTitle(title_);
+  SetText(message_);
+  SetFooter(kOkFooter);
+}
+
+int NotificationDialog::Run() {
+  SetTitle(title_);
+  SetText(message_);
+  SetFooter(kOkFooter);
+  while (WaitKey() != kKeyEnter) {
+  }
+  return 1;
+}
+
+}  // namespace Tulk
