@@ -15,10 +15,11 @@ class HykernelNicInfoImpl {
   /// Port-set selector for "the NICs of every port set".
   static constexpr int kAllPortsets = 0;
 
-  /// The kernel NICs attached to port set `portsetSelector` (a switch's
-  /// position in VirtualSwitchInfoImpl::GetVirtualSwitches, counted from 1),
-  /// or of every port set and the unattached ones for 0, in the host's
-  /// order.
+  /// The kernel NICs, in the host's order: for 0 every one (attached to
+  /// any switch, to an opaque network, or to nothing); otherwise those on
+  /// the port set at that position, counted from 1 over the standard
+  /// switches and then the distributed ones. Throws for a position beyond
+  /// the last switch.
   std::vector<HykNicImpl> GetHykernelNics(int portsetSelector = kAllPortsets) const;
 
   /// Creates a kernel NIC on the standard-switch portgroup `portGroup`,

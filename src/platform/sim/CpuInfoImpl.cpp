@@ -1,29 +1,28 @@
 #include "platform/api/CpuInfoImpl.h"
 
-#include "platform/api/HostMgrException.h"
-
-#pragma GCC diagnostic ignored "-Wunused-parameter"
+#include "platform/sim/SimState.h"
 
 namespace HykCtl::Hardware {
+namespace {
+
+const Sim::json& Cpu(const char* method) {
+  const Sim::json& state = Sim::Query(std::string("HykCtl::Hardware::CpuInfoImpl::") + method);
+  return Sim::ObjectAt(Sim::ObjectAt(state, "hardware"), "cpu");
+}
+
+}  // namespace
 
 int CpuInfoImpl::GetNumCpuPackages() const {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Hardware::CpuInfoImpl::GetNumCpuPackages is not implemented yet");
+  return Cpu("GetNumCpuPackages").value("packages", 1);
 }
-
 int CpuInfoImpl::GetNumCpuCores() const {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Hardware::CpuInfoImpl::GetNumCpuCores is not implemented yet");
+  return Cpu("GetNumCpuCores").value("cores", 1);
 }
-
 int CpuInfoImpl::GetNumCpuThreads() const {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Hardware::CpuInfoImpl::GetNumCpuThreads is not implemented yet");
+  return Cpu("GetNumCpuThreads").value("threads", 1);
 }
-
 std::string CpuInfoImpl::GetModelName() const {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Hardware::CpuInfoImpl::GetModelName is not implemented yet");
+  return Sim::StringAt(Cpu("GetModelName"), "model");
 }
 
 }  // namespace HykCtl::Hardware

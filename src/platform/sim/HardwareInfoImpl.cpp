@@ -1,54 +1,44 @@
 #include "platform/api/HardwareInfoImpl.h"
 
-#include "platform/api/HostMgrException.h"
-
-#pragma GCC diagnostic ignored "-Wunused-parameter"
+#include "platform/sim/SimState.h"
 
 namespace HykCtl::Hardware {
+namespace {
+
+std::string Field(const char* method, const char* section, const char* key) {
+  const Sim::json& state = Sim::Query(std::string("HykCtl::Hardware::HardwareInfoImpl::") + method);
+  const Sim::json& hardware = Sim::ObjectAt(state, "hardware");
+  return Sim::StringAt(section != nullptr ? Sim::ObjectAt(hardware, section) : hardware, key);
+}
+
+}  // namespace
 
 std::string HardwareInfoImpl::GetVendorName() const {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Hardware::HardwareInfoImpl::GetVendorName is not implemented yet");
+  return Field("GetVendorName", nullptr, "vendor");
 }
-
 std::string HardwareInfoImpl::GetProductName() const {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Hardware::HardwareInfoImpl::GetProductName is not implemented yet");
+  return Field("GetProductName", nullptr, "product");
 }
-
 std::string HardwareInfoImpl::GetSerialNumber() const {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Hardware::HardwareInfoImpl::GetSerialNumber is not implemented yet");
+  return Field("GetSerialNumber", nullptr, "serialNumber");
 }
-
 std::string HardwareInfoImpl::GetServiceTag() const {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Hardware::HardwareInfoImpl::GetServiceTag is not implemented yet");
+  return Field("GetServiceTag", nullptr, "serviceTag");
 }
-
 std::string HardwareInfoImpl::GetAssetTag() const {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Hardware::HardwareInfoImpl::GetAssetTag is not implemented yet");
+  return Field("GetAssetTag", nullptr, "assetTag");
 }
-
 std::string HardwareInfoImpl::GetBiosVersion() const {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Hardware::HardwareInfoImpl::GetBiosVersion is not implemented yet");
+  return Field("GetBiosVersion", "bios", "version");
 }
-
 std::string HardwareInfoImpl::GetBmcVersion() const {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Hardware::HardwareInfoImpl::GetBmcVersion is not implemented yet");
+  return Field("GetBmcVersion", "firmware", "bmc");
 }
-
 std::string HardwareInfoImpl::GetCpldVersion() const {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Hardware::HardwareInfoImpl::GetCpldVersion is not implemented yet");
+  return Field("GetCpldVersion", "firmware", "cpld");
 }
-
 std::string HardwareInfoImpl::GetPlsaVersion() const {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Hardware::HardwareInfoImpl::GetPlsaVersion is not implemented yet");
+  return Field("GetPlsaVersion", "firmware", "plsa");
 }
 
 }  // namespace HykCtl::Hardware

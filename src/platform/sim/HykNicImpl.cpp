@@ -1,104 +1,164 @@
 #include "platform/api/HykNicImpl.h"
 
-#include "platform/api/HostMgrException.h"
-
-#pragma GCC diagnostic ignored "-Wunused-parameter"
+#include "platform/sim/SimHost.h"
+#include "platform/sim/SimState.h"
 
 namespace HykCtl::Network {
 
+struct HykNicImpl::Snapshot {
+  Sim::json nic;
+  std::uint64_t generation = 0;
+};
+
+namespace {
+
+std::string Op(const char* method) {
+  return std::string("HykCtl::Network::HykNicImpl::") + method;
+}
+
+}  // namespace
+
 HykNicImpl::HykNicImpl(const std::string& name) : name_(name) {
+  Sim::Query(Op("HykNicImpl"));
+  Refresh();
 }
 
-HykNicImpl::~HykNicImpl() {
-}
+HykNicImpl::~HykNicImpl() = default;
+HykNicImpl::HykNicImpl(const HykNicImpl&) = default;
+HykNicImpl& HykNicImpl::operator=(const HykNicImpl&) = default;
+HykNicImpl::HykNicImpl(HykNicImpl&&) noexcept = default;
+HykNicImpl& HykNicImpl::operator=(HykNicImpl&&) noexcept = default;
 
-HykNicImpl::HykNicImpl(const HykNicImpl&) {
-}
-
-HykNicImpl& HykNicImpl::operator=(const HykNicImpl&) {
-  return *this;
-}
-
-HykNicImpl::HykNicImpl(HykNicImpl&&) noexcept {
-}
-
-HykNicImpl& HykNicImpl::operator=(HykNicImpl&&) noexcept {
-  return *this;
+const HykNicImpl::Snapshot& HykNicImpl::Current() const {
+  return *snapshot_;
 }
 
 bool HykNicImpl::IsStale() const {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Network::HykNicImpl::IsStale is not implemented yet");
+  Sim::Query(Op("IsStale"));
+  return Sim::SimHost::Instance().Generation() != snapshot_->generation;
 }
 
 void HykNicImpl::Refresh() {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Network::HykNicImpl::Refresh is not implemented yet");
+  const Sim::json& state = Sim::Query(Op("Refresh"));
+  auto snapshot = std::make_shared<Snapshot>();
+  snapshot->nic = Sim::RequireKernelNic(state, name_);
+  snapshot->generation = Sim::SimHost::Instance().Generation();
+  snapshot_ = std::move(snapshot);
 }
 
 std::string HykNicImpl::GetName() const {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Network::HykNicImpl::GetName is not implemented yet");
+  Sim::Query(Op("GetName"));
+  return name_;
 }
 
 HostMgr::Network::MacAddress HykNicImpl::GetMacAddress() const {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Network::HykNicImpl::GetMacAddress is not implemented yet");
+  Sim::Query(Op("GetMacAddress"));
+  return HostMgr::Network::MacAddress::FromString(
+      Sim::StringAt(Current().nic, "mac", "00:00:00:00:00:00"));
 }
 
 std::optional<ConnectionPoint> HykNicImpl::GetConnectionPoint() const {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Network::HykNicImpl::GetConnectionPoint is not implemented yet");
+  Sim::Query(Op("GetConnectionPoint"));
+  auto connection = Current().nic.find("connection");
+  if (connection == Current().nic.end() || !connection->is_object()) {
+    return std::nullopt;
+  }
+  const std::string type = Sim::StringAt(*connection, "type");
+  if (type == "portgroup") {
+    return ConnectionPoint(ConnectionPoint::kPortGroup, Sim::StringAt(*connection, "switch"),
+                           Sim::StringAt(*connection, "portGroup"), "");
+  }
+  if (type == "dvsPort") {
+    return ConnectionPoint(ConnectionPoint::kDvsPort, Sim::StringAt(*connection, "switch"), "",
+                           Sim::StringAt(*connection, "portId"));
+  }
+  return ConnectionPoint(ConnectionPoint::kOpaqueNetwork, Sim::StringAt(*connection, "name"), "",
+                         "");
 }
 
 bool HykNicImpl::IsEnabled() const {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Network::HykNicImpl::IsEnabled is not implemented yet");
+  Sim::Query(Op("IsEnabled"));
+  return Current().nic.value("enabled", true);
 }
 
 HostMgr::Network::IpConfig HykNicImpl::GetIpConfig() const {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Network::HykNicImpl::GetIpConfig is not implemented yet");
+  Sim::Query(Op("GetIpConfig"));
+  return Sim::ReadIpConfig(Current().nic);
 }
 
 void HykNicImpl::SetIpConfig(const HostMgr::Network::IpConfig& config) {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Network::HykNicImpl::SetIpConfig is not implemented yet");
+  Sim::Change(Op("SetIpConfig"), [&](Sim::json& state) {
+    Sim::json& nic = Sim::RequireKernelNic(state, name_);
+    Sim::WriteIpConfig(nic, config, Sim::ObjectAt(state["network"], "dhcpOffer"));
+  });
+  Refresh();
 }
 
 bool HykNicImpl::IsDhcpLeaseBound() const {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Network::HykNicImpl::IsDhcpLeaseBound is not implemented yet");
+  Sim::Query(Op("IsDhcpLeaseBound"));
+  const Sim::json& nic = Current().nic;
+  return Sim::StringAt(Sim::ObjectAt(nic, "ipv4"), "mode") == "dhcp" &&
+         Sim::ObjectAt(nic, "dhcpLease").value("bound", false);
 }
 
 void HykNicImpl::RenewDhcpLease() {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Network::HykNicImpl::RenewDhcpLease is not implemented yet");
+  Sim::Change(Op("RenewDhcpLease"), [&](Sim::json& state) {
+    Sim::json& nic = Sim::RequireKernelNic(state, name_);
+    if (Sim::StringAt(Sim::ObjectAt(nic, "ipv4"), "mode") != "dhcp") {
+      Sim::Fail("Hykernel NIC " + name_ + " does not use DHCP");
+    }
+    Sim::json lease = nic.contains("dhcpLease") && nic["dhcpLease"].is_object()
+                          ? nic["dhcpLease"]
+                          : Sim::json::object();
+    const Sim::json& offer = Sim::ObjectAt(state["network"], "dhcpOffer");
+    if (!offer.empty()) {
+      for (const auto& [key, value] : offer.items()) {
+        lease[key] = value;
+      }
+      lease["bound"] = true;
+    }
+    lease["renewals"] = lease.value("renewals", 0) + 1;
+    nic["dhcpLease"] = std::move(lease);
+  });
+  Refresh();
 }
 
 void HykNicImpl::SetMacAddressFromPnic(const std::string& pnicName) {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Network::HykNicImpl::SetMacAddressFromPnic is not implemented yet");
+  Sim::Change(Op("SetMacAddressFromPnic"), [&](Sim::json& state) {
+    const std::string mac = Sim::StringAt(Sim::RequirePnic(state, pnicName), "mac");
+    Sim::RequireKernelNic(state, name_)["mac"] = mac;
+  });
+  Refresh();
 }
 
 void HykNicImpl::ConnectToPortGroup(const std::string& portGroup) {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Network::HykNicImpl::ConnectToPortGroup is not implemented yet");
+  Sim::Change(Op("ConnectToPortGroup"), [&](Sim::json& state) {
+    const Sim::json& group = Sim::RequirePortGroup(state, portGroup);
+    Sim::RequireKernelNic(state, name_)["connection"] = {
+        {"type", "portgroup"}, {"switch", group["switch"]}, {"portGroup", portGroup}};
+  });
+  Refresh();
 }
 
 void HykNicImpl::Disable() {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Network::HykNicImpl::Disable is not implemented yet");
+  Sim::Change(Op("Disable"),
+              [&](Sim::json& state) { Sim::RequireKernelNic(state, name_)["enabled"] = false; });
+  Refresh();
 }
 
 void HykNicImpl::Enable() {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Network::HykNicImpl::Enable is not implemented yet");
+  Sim::Change(Op("Enable"),
+              [&](Sim::json& state) { Sim::RequireKernelNic(state, name_)["enabled"] = true; });
+  Refresh();
 }
 
 void HykNicImpl::Restart() {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Network::HykNicImpl::Restart is not implemented yet");
+  Sim::Change(Op("Restart"), [&](Sim::json& state) {
+    Sim::json& nic = Sim::RequireKernelNic(state, name_);
+    nic["enabled"] = true;
+    nic["restarts"] = nic.value("restarts", 0) + 1;
+  });
+  Refresh();
 }
 
 }  // namespace HykCtl::Network

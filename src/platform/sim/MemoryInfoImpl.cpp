@@ -1,19 +1,22 @@
 #include "platform/api/MemoryInfoImpl.h"
 
-#include "platform/api/HostMgrException.h"
-
-#pragma GCC diagnostic ignored "-Wunused-parameter"
+#include "platform/sim/SimState.h"
 
 namespace HykCtl::Hardware {
+namespace {
 
-std::uint64_t MemoryInfoImpl::GetTotalPages() const {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Hardware::MemoryInfoImpl::GetTotalPages is not implemented yet");
+const Sim::json& Memory(const char* method) {
+  const Sim::json& state = Sim::Query(std::string("HykCtl::Hardware::MemoryInfoImpl::") + method);
+  return Sim::ObjectAt(Sim::ObjectAt(state, "hardware"), "memory");
 }
 
+}  // namespace
+
+std::uint64_t MemoryInfoImpl::GetTotalPages() const {
+  return Memory("GetTotalPages").value("totalPages", std::uint64_t{0});
+}
 std::uint64_t MemoryInfoImpl::GetPageSize() const {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Hardware::MemoryInfoImpl::GetPageSize is not implemented yet");
+  return Memory("GetPageSize").value("pageSize", std::uint64_t{4096});
 }
 
 }  // namespace HykCtl::Hardware

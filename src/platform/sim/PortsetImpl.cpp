@@ -1,82 +1,207 @@
 #include "platform/api/PortsetImpl.h"
 
-#include "platform/api/HostMgrException.h"
+#include <algorithm>
 
-#pragma GCC diagnostic ignored "-Wunused-parameter"
+#include "platform/sim/SimState.h"
 
 namespace HykCtl::Network {
+namespace {
+
+std::string Op(const char* method) {
+  return std::string("HykCtl::Network::PortsetImpl::") + method;
+}
+
+bool IsStandard(const Sim::json& vswitch) {
+  return Sim::StringAt(vswitch, "type", "standard") == "standard";
+}
+
+Sim::json& RequireStandard(Sim::json& state, const std::string& name) {
+  Sim::json& vswitch = Sim::RequireSwitch(state, name);
+  if (!IsStandard(vswitch)) {
+    Sim::Fail("Operation not supported on distributed switch " + name);
+  }
+  return vswitch;
+}
+
+void EraseName(Sim::json& array, const std::string& name) {
+  for (auto it = array.begin(); it != array.end(); ++it) {
+    if (it->is_string() && it->get<std::string>() == name) {
+      array.erase(it);
+      return;
+    }
+  }
+}
+
+std::vector<std::string> Strings(const Sim::json& array) {
+  std::vector<std::string> names;
+  for (const Sim::json& name : array) {
+    names.push_back(name.get<std::string>());
+  }
+  return names;
+}
+
+}  // namespace
 
 PortsetImpl::PortsetImpl(const std::string& name) : name_(name) {
+  Sim::RequireSwitch(Sim::Query(Op("PortsetImpl")), name_);
 }
 
 bool PortsetImpl::IsValidVirtualSwitch(const std::string& name) {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Network::PortsetImpl::IsValidVirtualSwitch is not implemented yet");
+  const Sim::json& state = Sim::Query(Op("IsValidVirtualSwitch"));
+  return Sim::FindByName(Sim::ArrayAt(Sim::ObjectAt(state, "network"), "switches"), name) !=
+         nullptr;
 }
 
 int PortsetImpl::GetType() const {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Network::PortsetImpl::GetType is not implemented yet");
+  const Sim::json& vswitch = Sim::RequireSwitch(Sim::Query(Op("GetType")), name_);
+  return IsStandard(vswitch) ? kStandard : kDistributed;
 }
 
 std::vector<std::string> PortsetImpl::GetUplinks() const {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Network::PortsetImpl::GetUplinks is not implemented yet");
+  return Strings(Sim::ArrayAt(Sim::RequireSwitch(Sim::Query(Op("GetUplinks")), name_), "uplinks"));
 }
 
 std::vector<std::string> PortsetImpl::GetPortGroups() const {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Network::PortsetImpl::GetPortGroups is not implemented yet");
+  const Sim::json& state = Sim::Query(Op("GetPortGroups"));
+  const Sim::json& vswitch = Sim::RequireSwitch(state, name_);
+  if (!IsStandard(vswitch)) {
+    return Strings(Sim::ArrayAt(vswitch, "portGroups"));
+  }
+  std::vector<std::string> names;
+  for (const Sim::json& group : Sim::ArrayAt(Sim::ObjectAt(state, "network"), "portGroups")) {
+    if (Sim::StringAt(group, "switch") == name_) {
+      names.push_back(Sim::StringAt(group, "name"));
+    }
+  }
+  return names;
 }
 
 std::int64_t PortsetImpl::GetNumPorts() const {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Network::PortsetImpl::GetNumPorts is not implemented yet");
+  return Sim::RequireSwitch(Sim::Query(Op("GetNumPorts")), name_).value("numPorts", 0);
 }
 
 std::int64_t PortsetImpl::GetUsedPorts() const {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Network::PortsetImpl::GetUsedPorts is not implemented yet");
+  // Uplinks, kernel NICs and virtual machine ports each take one port.
+  const Sim::json& state = Sim::Query(Op("GetUsedPorts"));
+  const Sim::json& network = Sim::ObjectAt(state, "network");
+  const Sim::json& vswitch = Sim::RequireSwitch(state, name_);
+  std::int64_t used = static_cast<std::int64_t>(Sim::ArrayAt(vswitch, "uplinks").size());
+  for (const Sim::json& nic : Sim::ArrayAt(network, "hykernelNics")) {
+    if (Sim::StringAt(Sim::ObjectAt(nic, "connection"), "switch") == name_) {
+      ++used;
+    }
+  }
+  for (const Sim::json& group : Sim::ArrayAt(network, "portGroups")) {
+    if (Sim::StringAt(group, "switch") == name_) {
+      used += group.value("vmClients", 0);
+    }
+  }
+  return used;
 }
 
 std::int64_t PortsetImpl::GetConfiguredPorts() const {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Network::PortsetImpl::GetConfiguredPorts is not implemented yet");
+  const Sim::json& vswitch = Sim::RequireSwitch(Sim::Query(Op("GetConfiguredPorts")), name_);
+  return vswitch.value("configuredPorts", vswitch.value("numPorts", 0));
 }
 
 void PortsetImpl::AddUplink(const std::string& pnic) {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Network::PortsetImpl::AddUplink is not implemented yet");
+  Sim::Change(Op("AddUplink"), [&](Sim::json& state) {
+    Sim::RequirePnic(state, pnic);
+    const std::string user = Sim::SwitchOfUplink(state, pnic);
+    if (!user.empty()) {
+      Sim::Fail("Physical NIC " + pnic + " is already an uplink of " + user);
+    }
+    Sim::ArrayFor(RequireStandard(state, name_), "uplinks").push_back(pnic);
+  });
 }
 
 void PortsetImpl::RemoveUplink(const std::string& pnic) {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Network::PortsetImpl::RemoveUplink is not implemented yet");
+  Sim::Change(Op("RemoveUplink"), [&](Sim::json& state) {
+    Sim::json& vswitch = RequireStandard(state, name_);
+    if (Sim::SwitchOfUplink(state, pnic) != name_) {
+      Sim::Fail("Physical NIC " + pnic + " is not an uplink of " + name_);
+    }
+    EraseName(vswitch["uplinks"], pnic);
+    EraseName(Sim::ArrayFor(Sim::ObjectFor(vswitch, "teaming"), "uplinkOrder"), pnic);
+  });
 }
 
 void PortsetImpl::MoveUplink(const std::string& pnic, const std::string& targetSwitch) {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Network::PortsetImpl::MoveUplink is not implemented yet");
+  Sim::Change(Op("MoveUplink"), [&](Sim::json& state) {
+    if (Sim::SwitchOfUplink(state, pnic) != name_) {
+      Sim::Fail("Physical NIC " + pnic + " is not an uplink of " + name_);
+    }
+    Sim::json& target = RequireStandard(state, targetSwitch);
+    Sim::json& source = Sim::RequireSwitch(state, name_);
+    EraseName(source["uplinks"], pnic);
+    if (source.contains("teaming")) {
+      EraseName(Sim::ArrayFor(source["teaming"], "uplinkOrder"), pnic);
+    }
+    Sim::ArrayFor(target, "uplinks").push_back(pnic);
+  });
 }
 
 HostMgr::Network::NicTeamingPolicy PortsetImpl::GetTeamingPolicy() const {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Network::PortsetImpl::GetTeamingPolicy is not implemented yet");
+  const Sim::json& vswitch = Sim::RequireSwitch(Sim::Query(Op("GetTeamingPolicy")), name_);
+  const Sim::json& teaming = Sim::ObjectAt(vswitch, "teaming");
+  return HostMgr::Network::NicTeamingPolicy(Strings(Sim::ArrayAt(teaming, "uplinkOrder")),
+                                            teaming.value("maxActive", 0));
 }
 
 void PortsetImpl::SetTeamingPolicy(const HostMgr::Network::NicTeamingPolicy& policy) {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Network::PortsetImpl::SetTeamingPolicy is not implemented yet");
+  Sim::Change(Op("SetTeamingPolicy"), [&](Sim::json& state) {
+    Sim::json& vswitch = RequireStandard(state, name_);
+    const std::vector<std::string> uplinks = Strings(Sim::ArrayAt(vswitch, "uplinks"));
+    for (const std::string& name : policy.GetUplinkOrder()) {
+      if (std::find(uplinks.begin(), uplinks.end(), name) == uplinks.end()) {
+        Sim::Fail("Physical NIC " + name + " is not an uplink of " + name_);
+      }
+    }
+    if (policy.GetMaxActiveUplinks() < 0) {
+      Sim::Fail("Invalid number of active uplinks " + std::to_string(policy.GetMaxActiveUplinks()));
+    }
+    vswitch["teaming"] = {{"uplinkOrder", policy.GetUplinkOrder()},
+                          {"maxActive", policy.GetMaxActiveUplinks()}};
+  });
 }
 
 void PortsetImpl::AddPortGroup(const std::string& name, int vlanId) {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Network::PortsetImpl::AddPortGroup is not implemented yet");
+  Sim::Change(Op("AddPortGroup"), [&](Sim::json& state) {
+    RequireStandard(state, name_);
+    if (name.empty()) {
+      Sim::Fail("A portgroup needs a name");
+    }
+    if (vlanId < 0 || vlanId > 4095) {
+      Sim::Fail("Invalid VLAN id " + std::to_string(vlanId));
+    }
+    Sim::json& groups = Sim::ArrayFor(Sim::ObjectFor(state, "network"), "portGroups");
+    if (Sim::FindByName(groups, name) != nullptr) {
+      Sim::Fail("Portgroup " + name + " already exists");
+    }
+    groups.push_back({{"name", name}, {"switch", name_}, {"vlanId", vlanId}});
+  });
 }
 
 void PortsetImpl::RemovePortGroup(const std::string& name) {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Network::PortsetImpl::RemovePortGroup is not implemented yet");
+  Sim::Change(Op("RemovePortGroup"), [&](Sim::json& state) {
+    RequireStandard(state, name_);
+    if (Sim::StringAt(Sim::RequirePortGroup(state, name), "switch") != name_) {
+      Sim::Fail("Portgroup " + name + " is not on " + name_);
+    }
+    Sim::json& network = state["network"];
+    for (const Sim::json& nic : Sim::ArrayAt(network, "hykernelNics")) {
+      if (Sim::StringAt(Sim::ObjectAt(nic, "connection"), "portGroup") == name) {
+        Sim::Fail("Portgroup " + name + " is in use by " + Sim::StringAt(nic, "name"));
+      }
+    }
+    Sim::json& groups = network["portGroups"];
+    for (auto it = groups.begin(); it != groups.end(); ++it) {
+      if (Sim::StringAt(*it, "name") == name) {
+        groups.erase(it);
+        break;
+      }
+    }
+  });
 }
 
 }  // namespace HykCtl::Network

@@ -1,28 +1,31 @@
 #include "platform/api/ProductState.h"
 
+#include <array>
 #include <string>
 
+#include "platform/api/HostMgrException.h"
 #include "platform/sim/SimHost.h"
 
 namespace {
 
-// The texts live as long as the process, as the real library's do.
-const char* ProductField(const char* key, const char* fallback) {
-  static std::string fields[4];
-  static const char* const kKeys[4] = {"name", "version", "build", "compilationOption"};
-  for (int i = 0; i < 4; ++i) {
-    if (std::string(kKeys[i]) == key) {
-      const nlohmann::json& state = Sim::SimHost::Instance().State();
-      auto product = state.find("product");
-      if (product != state.end() && product->contains(key) && (*product)[key].is_string()) {
-        fields[i] = (*product)[key].get<std::string>();
-      } else {
-        fields[i] = fallback;
-      }
-      return fields[i].c_str();
+enum Field { kName, kVersion, kBuild, kCompilationOption, kFieldCount };
+
+// The texts live as long as the process, as the real library's do; each
+// call refreshes its own field.
+const char* ProductField(Field field, const char* key) {
+  static std::array<std::string, kFieldCount> fields;
+  try {
+    const nlohmann::json& state = Sim::SimHost::Instance().State();
+    auto product = state.find("product");
+    if (product != state.end() && product->contains(key)) {
+      fields[field] = (*product)[key].get<std::string>();
+    } else {
+      fields[field].clear();
     }
+  } catch (const HostMgr::Lib::HostMgrException&) {
+    // Without a readable state the identity stays as it was.
   }
-  return fallback;
+  return fields[field].c_str();
 }
 
 }  // namespace
@@ -30,15 +33,15 @@ const char* ProductField(const char* key, const char* fallback) {
 extern "C" {
 
 const char* ProductState_GetName() {
-  return ProductField("name", "");
+  return ProductField(kName, "name");
 }
 const char* ProductState_GetVersion() {
-  return ProductField("version", "");
+  return ProductField(kVersion, "version");
 }
 const char* ProductState_GetBuildNumberString() {
-  return ProductField("build", "");
+  return ProductField(kBuild, "build");
 }
 const char* ProductState_GetCompilationOption() {
-  return ProductField("compilationOption", "");
+  return ProductField(kCompilationOption, "compilationOption");
 }
 }

@@ -1,19 +1,29 @@
 #include "platform/api/ResourceInfoImpl.h"
 
-#include "platform/api/HostMgrException.h"
-
-#pragma GCC diagnostic ignored "-Wunused-parameter"
+#include "platform/sim/SimState.h"
 
 namespace HykCtl::Resource {
+namespace {
+
+std::vector<std::string> Running(const Sim::json& state) {
+  std::vector<std::string> names;
+  for (const Sim::json& vm : Sim::ArrayAt(state, "vms")) {
+    if (Sim::StringAt(vm, "state", "poweredOff") == "running") {
+      names.push_back(Sim::StringAt(vm, "name"));
+    }
+  }
+  return names;
+}
+
+}  // namespace
 
 bool ResourceInfoImpl::HasRunningVirtualMachines() const {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Resource::ResourceInfoImpl::HasRunningVirtualMachines is not implemented yet");
+  return !Running(Sim::Query("HykCtl::Resource::ResourceInfoImpl::HasRunningVirtualMachines"))
+              .empty();
 }
 
 std::vector<std::string> ResourceInfoImpl::GetRunningVirtualMachines() const {
-  throw HostMgr::Lib::HostMgrException(
-      "HykCtl::Resource::ResourceInfoImpl::GetRunningVirtualMachines is not implemented yet");
+  return Running(Sim::Query("HykCtl::Resource::ResourceInfoImpl::GetRunningVirtualMachines"));
 }
 
 }  // namespace HykCtl::Resource

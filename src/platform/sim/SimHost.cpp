@@ -1,6 +1,7 @@
 #include "platform/sim/SimHost.h"
 
 #include <fcntl.h>
+#include <sys/file.h>
 #include <unistd.h>
 
 #include <cerrno>
@@ -27,24 +28,66 @@ void RemoveDemoFile() {
   }
 }
 
-// Without TULK_HOST_STATE the demo host is written to a private file, which
+std::string Environment(const char* name) {
+  const char* value = std::getenv(name);
+  return value != nullptr ? value : "";
+}
+
+// Without a state file the demo host is written to a private file, which
 // the environment then names for the simulated tools this process starts.
 std::string MaterialiseDemoHost() {
-  const char* tmp = std::getenv("TMPDIR");
-  std::string folder = (tmp != nullptr && *tmp != '\0') ? tmp : "/tmp";
-  std::string pattern = folder + "/tulk-demo-host-XXXXXX";
+  const std::string tmpdir = Environment("TMPDIR");
+  const std::string text = DemoHostState().dump(2) + "\n";
+  if (!tmpdir.empty()) {
+    std::string fixed = tmpdir + "/host-state.json";
+    int fd = open(fixed.c_str(), O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, 0644);
+    if (fd >= 0) {
+      close(fd);
+      WriteFileAtomically(fixed, text);
+      setenv("TULK_HOST_STATE", fixed.c_str(), 1);
+      return fixed;
+    }
+  }
+  std::string pattern = (tmpdir.empty() ? std::string("/tmp") : tmpdir) + "/tulk-demo-host-XXXXXX";
   int fd = mkstemp(pattern.data());
   if (fd < 0) {
-    throw StateError("cannot create the demo host state in " + folder + ": " +
+    throw StateError("cannot create the demo host state in " + pattern + ": " +
                      std::strerror(errno));
   }
   close(fd);
-  WriteFileAtomically(pattern, DemoHostState().dump(2) + "\n");
+  WriteFileAtomically(pattern, text);
   setenv("TULK_HOST_STATE", pattern.c_str(), 1);
   setenv("TULK_SIM_DEMO_FILE", pattern.c_str(), 1);
   std::atexit(RemoveDemoFile);
   return pattern;
 }
+
+// Holds an exclusive flock on the state's lock file for one change.
+class StateLock {
+ public:
+  explicit StateLock(const std::string& statePath) {
+    const std::string path = statePath + ".lock";
+    fd_ = open(path.c_str(), O_RDWR | O_CREAT | O_CLOEXEC, 0644);
+    if (fd_ < 0) {
+      throw HostMgr::Lib::HostMgrException("Cannot lock host state " + path + ": " +
+                                           std::strerror(errno));
+    }
+    while (flock(fd_, LOCK_EX) != 0) {
+      if (errno != EINTR) {
+        int error = errno;
+        close(fd_);
+        throw HostMgr::Lib::HostMgrException("Cannot lock host state " + path + ": " +
+                                             std::strerror(error));
+      }
+    }
+  }
+  ~StateLock() { close(fd_); }
+  StateLock(const StateLock&) = delete;
+  StateLock& operator=(const StateLock&) = delete;
+
+ private:
+  int fd_ = -1;
+};
 
 }  // namespace
 
@@ -54,10 +97,36 @@ SimHost& SimHost::Instance() {
 }
 
 void SimHost::Load() {
-  const char* path = std::getenv("TULK_HOST_STATE");
-  path_ = (path != nullptr && *path != '\0') ? path : MaterialiseDemoHost();
+  std::string path = Environment("TULK_HOST_STATE");
+  if (path.empty()) {
+    const std::string rootFile = RootStateFile();
+    if (access(rootFile.c_str(), F_OK) == 0) {
+      path = rootFile;
+      setenv("TULK_HOST_STATE", path.c_str(), 1);
+    } else {
+      path = MaterialiseDemoHost();
+    }
+  }
+  path_ = path;
   ReadFile();
   loaded_ = true;
+}
+
+void SimHost::Reset() {
+  loaded_ = false;
+  path_.clear();
+  state_ = nlohmann::json();
+  ++generation_;
+}
+
+void SimHost::EnsureLoaded() {
+  if (!loaded_) {
+    try {
+      Load();
+    } catch (const StateError& error) {
+      throw HostMgr::Lib::HostMgrException(error.what());
+    }
+  }
 }
 
 void SimHost::ReadFile() {
@@ -82,6 +151,7 @@ void SimHost::ReadFile() {
   }
   state_ = std::move(parsed);
   stamp_ = stamp;
+  ++generation_;
 }
 
 bool SimHost::FileChanged() const {
@@ -92,10 +162,9 @@ bool SimHost::FileChanged() const {
   return !SameStamp(now, stamp_);
 }
 
-nlohmann::json& SimHost::State() {
-  if (!loaded_) {
-    Load();
-  } else if (FileChanged()) {
+const nlohmann::json& SimHost::State() {
+  EnsureLoaded();
+  if (FileChanged()) {
     try {
       ReadFile();
     } catch (const StateError&) {
@@ -105,41 +174,54 @@ nlohmann::json& SimHost::State() {
   return state_;
 }
 
-void SimHost::Save() {
-  WriteFileAtomically(path_, state_.dump(2) + "\n");
+void SimHost::Modify(const std::function<void(nlohmann::json&)>& change) {
+  EnsureLoaded();
+  StateLock lock(path_);
+  if (FileChanged()) {
+    try {
+      ReadFile();
+    } catch (const StateError& error) {
+      throw HostMgr::Lib::HostMgrException(error.what());
+    }
+  }
+  nlohmann::json next = state_;
+  change(next);
+  try {
+    WriteFileAtomically(path_, next.dump(2) + "\n");
+  } catch (const StateError& error) {
+    throw HostMgr::Lib::HostMgrException(error.what());
+  }
+  state_ = std::move(next);
   stat(path_.c_str(), &stamp_);
+  ++generation_;
 }
 
 void SimHost::CheckFault(std::string_view operation) {
   const nlohmann::json& state = State();
   auto faults = state.find("faults");
-  if (faults == state.end() || !faults->is_object()) {
+  if (faults == state.end() || faults->empty()) {
     return;
   }
   auto fault = faults->find(std::string(operation));
+  if (fault == faults->end()) {
+    // The short form: the last two "::"-separated parts.
+    std::string_view shortName = operation;
+    if (auto method = operation.rfind("::"); method != std::string_view::npos && method > 0) {
+      if (auto cls = operation.rfind("::", method - 1); cls != std::string_view::npos) {
+        shortName = operation.substr(cls + 2);
+      }
+    }
+    fault = faults->find(std::string(shortName));
+  }
   if (fault != faults->end()) {
     throw HostMgr::Lib::HostMgrException(fault->is_string() ? fault->get<std::string>()
                                                             : fault->dump());
   }
 }
 
-void ValidateState(const nlohmann::json& state) {
-  if (!state.is_object()) {
-    throw StateError("the document must be a JSON object");
-  }
-  if (auto faults = state.find("faults"); faults != state.end() && !faults->is_object()) {
-    throw StateError("\"faults\" must be an object");
-  }
-  if (auto options = state.find("advancedOptions"); options != state.end()) {
-    if (!options->is_object()) {
-      throw StateError("\"advancedOptions\" must be an object");
-    }
-    for (const auto& [name, value] : options->items()) {
-      if (!value.is_number_integer()) {
-        throw StateError("advanced option \"" + name + "\" must be an integer");
-      }
-    }
-  }
+std::uint64_t SimHost::Generation() {
+  State();
+  return generation_;
 }
 
 void WriteFileAtomically(const std::string& path, const std::string& text) {
@@ -173,6 +255,23 @@ void WriteFileAtomically(const std::string& path, const std::string& text) {
     unlink(temporary.c_str());
     throw StateError(path + ": cannot write host state: " + std::strerror(error));
   }
+}
+
+std::string RootPath(std::string_view path) {
+  std::string root = Environment("TULK_ROOT");
+  while (!root.empty() && root.back() == '/') {
+    root.pop_back();
+  }
+  std::string result = root;
+  if (path.empty() || path.front() != '/') {
+    result += '/';
+  }
+  result += path;
+  return result;
+}
+
+std::string RootStateFile() {
+  return RootPath("/var/lib/tulk-sim/host-state.json");
 }
 
 }  // namespace Sim

@@ -1,22 +1,37 @@
 #pragma once
 /// The simulated host: the whole host state in one JSON document.
 ///
-/// The state comes from the file named by TULK_HOST_STATE, or, when that
-/// is unset, from the built-in demo host (DemoHost.h), which is written to a
-/// private file so that the simulated host tools started by the console act
-/// on the same state. The format is documented in docs/simulated-host.md.
+/// Where the state lives, in this order:
+/// 1. the file named by TULK_HOST_STATE;
+/// 2. the root's own state file, "<TULK_ROOT>/var/lib/tulk-sim/host-state.json",
+///    when it exists (scripts/make-demo-root.sh writes it, so that changes
+///    persist across runs);
+/// 3. the built-in demo host (DemoHost.h), written to a private file:
+///    "$TMPDIR/host-state.json" when TMPDIR is set and that file does not
+///    exist yet (it is kept: TMPDIR is the caller's scratch folder), else a
+///    unique file under TMPDIR or /tmp, removed at exit.
+/// In cases 2 and 3 TULK_HOST_STATE is then set to the file, so that the
+/// simulated host tools started by the console act on the same state. The
+/// format is documented in docs/simulated-host.md.
 ///
-/// Every change is written back at once and atomically (temporary file,
-/// fsync, rename): a change made in one run is seen by the next, and a crash
-/// never leaves a half-written file. The file is re-read whenever another
-/// process (a simulated tool) replaced it.
+/// Every change is a locked read-modify-write (flock on "<state>.lock"),
+/// written back at once and atomically (temporary file, fsync, rename): the
+/// console and the tools may change the file concurrently without losing
+/// an update, a change is seen by the next run, and a crash never leaves a
+/// half-written file. Reads re-read the file only when it was replaced
+/// (device, inode, size and modification time are compared), so a query
+/// on an unchanged state costs one stat().
 ///
-/// Fault injection: the state's "faults" object maps an operation name
-/// (such as "HykCtl::Network::NetworkInfoImpl::GetPnics") to a message; that
-/// operation then throws HostMgr::Lib::HostMgrException with the message.
+/// Fault injection: the state's "faults" object maps an operation name to
+/// a message; that operation then throws HostMgr::Lib::HostMgrException
+/// with the message. Operations are named "Namespace::Class::Method" (such
+/// as "HykCtl::Network::NetworkInfoImpl::GetPnics"), C functions by their
+/// name ("QobUserLib_Init"); the short form "Class::Method" works too.
 
 #include <sys/stat.h>
 
+#include <cstdint>
+#include <functional>
 #include <nlohmann/json.hpp>
 #include <stdexcept>
 #include <string>
@@ -24,50 +39,69 @@
 
 namespace Sim {
 
-/// A state file that cannot be read or parsed.
+/// A state file that cannot be read, parsed or written.
 class StateError : public std::runtime_error {
  public:
   using std::runtime_error::runtime_error;
 };
 
+/// The process-wide simulated host.
 class SimHost {
  public:
   /// The process-wide simulated host (loaded on first use).
   static SimHost& Instance();
 
-  /// Loads the state now. Throws StateError for a missing or malformed
-  /// file; the file is never overwritten then.
+  /// Finds and loads the state now. Throws StateError for a missing or
+  /// malformed file; the file is never overwritten then.
   void Load();
 
-  /// The current state, re-read first when the file was replaced.
-  nlohmann::json& State();
+  /// Forgets the loaded state; the next use finds and loads it again.
+  void Reset();
 
-  /// Writes the state back atomically.
-  void Save();
+  /// The current state, re-read first when the file was replaced. A file
+  /// replaced by a malformed one keeps the last good state.
+  const nlohmann::json& State();
+
+  /// Applies `change` as one locked read-modify-write and saves the result.
+  /// When `change` throws, nothing is written and the exception passes on.
+  /// Failures to read or write the file throw HostMgr::Lib::HostMgrException.
+  void Modify(const std::function<void(nlohmann::json&)>& change);
 
   /// Throws HostMgr::Lib::HostMgrException when `operation` has a fault.
   void CheckFault(std::string_view operation);
 
-  /// The state file's path.
+  /// A number that changes whenever the state changed (re-read or
+  /// modified); equal numbers mean an unchanged state.
+  std::uint64_t Generation();
+
+  /// The state file's path (empty before Load).
   const std::string& Path() const { return path_; }
 
  private:
   SimHost() = default;
   void ReadFile();
   bool FileChanged() const;
+  void EnsureLoaded();
 
   std::string path_;
   nlohmann::json state_;
   bool loaded_ = false;
+  std::uint64_t generation_ = 0;
   struct stat stamp_ {};
 };
 
 /// Validates a parsed state document; throws StateError naming the first
-/// problem.
+/// problem ("network.pnics[1].linkUp must be a boolean").
 void ValidateState(const nlohmann::json& state);
 
 /// Writes `text` to `path` atomically (temporary file in the same folder,
 /// fsync, rename). Throws StateError on failure.
 void WriteFileAtomically(const std::string& path, const std::string& text);
+
+/// `path` (absolute) under the host root TULK_ROOT ("/" when unset).
+std::string RootPath(std::string_view path);
+
+/// The root's own state file, "<TULK_ROOT>/var/lib/tulk-sim/host-state.json".
+std::string RootStateFile();
 
 }  // namespace Sim

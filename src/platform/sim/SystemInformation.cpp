@@ -3,15 +3,12 @@
 #include <cstring>
 #include <string>
 
-#include "platform/sim/SimHost.h"
+#include "platform/sim/SimState.h"
 
 namespace {
 
-void CopyField(char* target, std::size_t size, const nlohmann::json& object, const char* key) {
-  std::string value;
-  if (object.is_object() && object.contains(key) && object[key].is_string()) {
-    value = object[key].get<std::string>();
-  }
+void CopyField(char* target, std::size_t size, const Sim::json& object, const char* key) {
+  const std::string value = Sim::StringAt(object, key);
   std::strncpy(target, value.c_str(), size - 1);
   target[size - 1] = '\0';
 }
@@ -19,16 +16,14 @@ void CopyField(char* target, std::size_t size, const nlohmann::json& object, con
 }  // namespace
 
 int HSI_Get(HSI_Node node, void* buffer, std::size_t size) {
-  Sim::SimHost& host = Sim::SimHost::Instance();
-  host.CheckFault("HSI_Get");
-  const nlohmann::json& state = host.State();
+  const Sim::json& state = Sim::Query("HSI_Get");
   switch (node) {
     case HSI_NODE_system_version: {
-      if (size < sizeof(HSI_SystemVersion)) {
+      if (buffer == nullptr || size < sizeof(HSI_SystemVersion)) {
         return 1;
       }
       HSI_SystemVersion record{};
-      const nlohmann::json product = state.value("product", nlohmann::json::object());
+      const Sim::json& product = Sim::ObjectAt(state, "product");
       CopyField(record.productName, sizeof record.productName, product, "name");
       CopyField(record.version, sizeof record.version, product, "version");
       CopyField(record.kernelRelease, sizeof record.kernelRelease, product, "kernelRelease");
@@ -37,8 +32,9 @@ int HSI_Get(HSI_Node node, void* buffer, std::size_t size) {
       return 0;
     }
     case HSI_NODE_system_bootOption: {
-      auto boot = state.find("bootOption");
-      if (boot == state.end() || !boot->is_number_integer() || size < 1) {
+      const Sim::json& system = Sim::ObjectAt(state, "system");
+      auto boot = system.find("bootOption");
+      if (boot == system.end() || buffer == nullptr || size < 1) {
         return 1;
       }
       std::memset(buffer, 0, size);
