@@ -56,6 +56,7 @@ int main(int argc, char** argv) {
   hooks.preferenceInit = Tulk::InitPreferences;
   hooks.readIdleTimeout = Tulk::ReadTulkTimeout;
   hooks.initProductLogging = Tulk::InitProductLogging;
+  hooks.afterStartup = Tulk::StartHostServices;
   hooks.runWelcome = [] {
     try {
       PlainWelcomeFrame welcome;

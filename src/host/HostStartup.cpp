@@ -1,7 +1,11 @@
 #include "host/HostStartup.h"
 
+#include <cstdlib>
 #include <limits>
 
+#include "host/AuditLog.h"
+#include "host/EventReporter.h"
+#include "host/HostValueProviders.h"
 #include "include/Constants.h"
 #include "platform/api/AdvancedOption.h"
 #include "platform/api/HostMgrException.h"
@@ -31,6 +35,14 @@ std::optional<std::uint32_t> ReadTulkTimeout() {
   } catch (const HostMgr::Lib::HostMgrException&) {
     return std::nullopt;
   }
+}
+
+void StartHostServices() {
+  RegisterHostValueProviders();
+  if (InitEventReporting()) {
+    std::atexit(CloseEventReporting);
+  }
+  WriteProductIssueRecord();
 }
 
 }  // namespace Tulk

@@ -19,4 +19,12 @@ void InitProductLogging();
 /// not a valid number of seconds.
 std::optional<std::uint32_t> ReadTulkTimeout();
 
+/// One-time set-up of the host services after the console's start-up
+/// (before the welcome screen): registers the renderer's host values
+/// (RegisterHostValueProviders), opens the observation-event facility for
+/// the whole run (closed again at process exit; events are still posted,
+/// each opening it, when it could not be opened here) and writes the audit
+/// record "product.issue".
+void StartHostServices();
+
 }  // namespace Tulk

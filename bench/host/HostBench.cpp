@@ -1,0 +1,142 @@
+// Command runner and inventory queries, measured in a scratch root on the
+// built-in demo host:
+//   tulk-host-bench [--benchmark_filter=...]
+// The runner cases spawn a trivial program and wait for its captured exit;
+// the inventory cases run one query each.
+
+#include <benchmark/benchmark.h>
+#include <stdlib.h>
+#include <unistd.h>
+
+#include <cstdint>
+#include <filesystem>
+#include <string>
+#include <vector>
+
+#include "host/CommandRunner.h"
+#include "host/HardwareInventory.h"
+#include "host/ManagementNetwork.h"
+#include "host/NetworkInventory.h"
+
+namespace {
+
+namespace fs = std::filesystem;
+
+void RunTrivial(benchmark::State& state) {
+  for (auto _ : state) {
+    benchmark::DoNotOptimize(
+        Tulk::RunCommand("/bin/true", {"true"}, nullptr, nullptr, nullptr, nullptr, nullptr, 0, 0));
+  }
+}
+BENCHMARK(RunTrivial)->Unit(benchmark::kMicrosecond)->UseRealTime();
+
+void RunCapturedWithTimeout(benchmark::State& state) {
+  char output[Tulk::kCaptureBufferSize];
+  char error[Tulk::kCaptureBufferSize];
+  for (auto _ : state) {
+    std::int32_t outputLength = sizeof output;
+    std::int32_t errorLength = sizeof error;
+    int rc = Tulk::RunCommand("/bin/echo", {"echo", "captured"}, output, &outputLength, error,
+                              &errorLength, "input", 5, 5);
+    if (rc != 0 || outputLength != 9) {
+      state.SkipWithError("unexpected result");
+    }
+  }
+}
+BENCHMARK(RunCapturedWithTimeout)->Unit(benchmark::kMicrosecond)->UseRealTime();
+
+void RunShellLine(benchmark::State& state) {
+  for (auto _ : state) {
+    benchmark::DoNotOptimize(Tulk::RunShellCommand("exit 0"));
+  }
+}
+BENCHMARK(RunShellLine)->Unit(benchmark::kMicrosecond)->UseRealTime();
+
+template <typename Record, bool (*Query)(std::vector<Record>&)>
+void ListQuery(benchmark::State& state) {
+  for (auto _ : state) {
+    std::vector<Record> rows;
+    if (!Query(rows)) {
+      state.SkipWithError("query failed");
+    }
+    benchmark::DoNotOptimize(rows);
+  }
+}
+BENCHMARK(ListQuery<Tulk::HykNicInfo, Tulk::GetKernelNicList>)->Name("GetKernelNicList");
+BENCHMARK(ListQuery<Tulk::PortGroupInfo, Tulk::GetPortGroupList>)->Name("GetPortGroupList");
+BENCHMARK(ListQuery<Tulk::SwitchSummary, Tulk::ScanVirtualSwitches>)->Name("ScanVirtualSwitches");
+BENCHMARK(ListQuery<Tulk::SwitchSummary, Tulk::GetStandardSwitchList>)
+    ->Name("GetStandardSwitchList");
+
+void GetPhysicalNicList(benchmark::State& state) {
+  std::vector<Tulk::SwitchSummary> switches;
+  Tulk::ScanVirtualSwitches(switches);
+  Tulk::PnicUsage usage = Tulk::BuildPnicUsage(switches);
+  for (auto _ : state) {
+    std::vector<Tulk::PnicRow> rows;
+    if (!Tulk::GetPhysicalNicList(rows, usage)) {
+      state.SkipWithError("query failed");
+    }
+    benchmark::DoNotOptimize(rows);
+  }
+}
+BENCHMARK(GetPhysicalNicList);
+
+template <auto Query>
+void TextQuery(benchmark::State& state) {
+  for (auto _ : state) {
+    benchmark::DoNotOptimize(Query());
+  }
+}
+BENCHMARK(TextQuery<Tulk::GetManagementInterface>)->Name("GetManagementInterface");
+BENCHMARK(TextQuery<Tulk::GetManagementIpv4Address>)->Name("GetManagementIpv4Address");
+BENCHMARK(TextQuery<Tulk::GetHostFqdn>)->Name("GetHostFqdn");
+BENCHMARK(TextQuery<Tulk::FormatMemorySize>)->Name("FormatMemorySize");
+BENCHMARK(TextQuery<Tulk::IsManagementOnDistributedSwitch>)
+    ->Name("IsManagementOnDistributedSwitch");
+
+void GetVersionString(benchmark::State& state) {
+  for (auto _ : state) {
+    benchmark::DoNotOptimize(Tulk::GetVersionString(static_cast<int>(state.range(0))));
+  }
+}
+BENCHMARK(GetVersionString)->DenseRange(1, 4);
+
+// A scratch root with the two programs the runner cases start, so nothing
+// of the real machine is run or changed.
+fs::path MakeScratchRoot() {
+  std::string pattern = (fs::temp_directory_path() / "tulk-host-bench-XXXXXX").string();
+  if (mkdtemp(pattern.data()) == nullptr) {
+    return {};
+  }
+  fs::path root = pattern;
+  fs::create_directories(root / "bin");
+  fs::create_directories(root / "sbin");
+  for (const char* program : {"true", "echo", "sh"}) {
+    for (const char* folder : {"/usr/bin", "/bin"}) {
+      fs::path real = fs::path(folder) / program;
+      if (access(real.c_str(), X_OK) == 0) {
+        fs::create_symlink(real, root / "bin" / program);
+        break;
+      }
+    }
+  }
+  return root;
+}
+
+}  // namespace
+
+int main(int argc, char** argv) {
+  fs::path root = MakeScratchRoot();
+  if (root.empty()) {
+    return 1;
+  }
+  setenv("TULK_ROOT", root.c_str(), 1);
+  unsetenv("TULK_HOST_STATE");
+  benchmark::Initialize(&argc, argv);
+  benchmark::RunSpecifiedBenchmarks();
+  benchmark::Shutdown();
+  std::error_code ignored;
+  fs::remove_all(root, ignored);
+  return 0;
+}

@@ -1,0 +1,103 @@
+// The inventory's text formats: memory size, switch summary, name lists,
+// event messages. Pure functions of their input.
+
+#include <gtest/gtest.h>
+
+#include <cstdint>
+#include <string>
+#include <vector>
+
+#include "host/EventReporter.h"
+#include "host/HardwareInventory.h"
+#include "host/NetworkInventory.h"
+#include "host/SwitchSummary.h"
+
+namespace {
+
+constexpr std::uint64_t kMiB = 1024ull * 1024;
+constexpr std::uint64_t kGiB = 1024 * kMiB;
+constexpr std::uint64_t kTiB = 1024 * kGiB;
+constexpr std::uint64_t kPiB = 1024 * kTiB;
+
+TEST(FormatMemoryBytesTest, RoundsUpToQuarterGibibytesAndCutsTheDecimal) {
+  struct Case {
+    std::uint64_t bytes;
+    const char* text;
+  };
+  const Case cases[] = {
+      {8 * kGiB, "8 GB"},
+      {6 * kGiB - 1, "6 GB"},
+      {2 * kGiB + 768 * kMiB, "2.7 GB"},  // 2.75: cut, not rounded
+      {512 * kMiB, "512 MB"},
+      {1 * kGiB, "1 GB"},
+      {1 * kGiB + 1, "1.2 GB"},  // goes up to 1.25
+      {1, "256 MB"},
+      {0, "0 MB"},
+      {1023 * kMiB, "1 GB"},  // 1023 MiB rounds to 1024 MiB
+      {kTiB + 512 * kGiB, "1.5 TB"},
+      {3 * kPiB, "3 PB"},
+      {2048 * kPiB, "2048 PB"},  // the unit table ends at P
+  };
+  for (const Case& c : cases) {
+    EXPECT_EQ(Tulk::FormatMemoryBytes(c.bytes), c.text) << c.bytes;
+  }
+}
+
+TEST(SwitchSummaryTest, FormatsCountsAndNameLists) {
+  Tulk::SwitchSummary summary{
+      "vSwitch0", {"hynic0", "hynic1"}, {"Management Network", "VM Network"}, 128, 5, 128};
+  EXPECT_EQ(Tulk::FormatSwitchSummary(summary),
+            "Number of ports: 128\nUsed ports: 5\nConfigured ports: 128\n"
+            "Uplinks: hynic0,hynic1\nPort groups: Management Network,VM Network");
+
+  Tulk::SwitchSummary bare{"vSwitch9", {}, {}, -1, 0, 0};
+  EXPECT_EQ(Tulk::FormatSwitchSummary(bare),
+            "Number of ports: -1\nUsed ports: 0\nConfigured ports: 0\nUplinks: None\n"
+            "Port groups: None");
+}
+
+TEST(SwitchSummaryTest, JoinNamesUsesCommasWithoutBlanks) {
+  EXPECT_EQ(Tulk::JoinNames({}), "None");
+  EXPECT_EQ(Tulk::JoinNames({"a"}), "a");
+  EXPECT_EQ(Tulk::JoinNames({"a", "b c", "d"}), "a,b c,d");
+  EXPECT_EQ(Tulk::JoinNames({""}), "");
+}
+
+TEST(PnicUsageTest, MapsEachUplinkToItsSwitch) {
+  std::vector<Tulk::SwitchSummary> switches = {{"vSwitch0", {"hynic0", "hynic2"}, {}, 0, 0, 0},
+                                               {"dvs-lab", {"hynic1"}, {}, 0, 0, 0},
+                                               {"vSwitch1", {}, {}, 0, 0, 0}};
+  EXPECT_EQ(
+      Tulk::BuildPnicUsage(switches),
+      (Tulk::PnicUsage{{"hynic0", "vSwitch0"}, {"hynic1", "dvs-lab"}, {"hynic2", "vSwitch0"}}));
+}
+
+TEST(EventMessageTest, MessagesCarryMarkerIdAndText) {
+  struct Case {
+    Tulk::TulkEvent event;
+    const char* message;
+  };
+  using Tulk::TulkEvent;
+  const Case cases[] = {
+      {TulkEvent::LoginAccessDenied,
+       "@&!*@*@(qob.user.tulk.login.failed)Access denied for user %s"},
+      {TulkEvent::LoginAuthenticationFailed,
+       "@&!*@*@(qob.user.tulk.login.failed)Authentication of user %s failed"},
+      {TulkEvent::PasswordChanged,
+       "@&!*@*@(qob.user.tulk.login.passwd.changed)Login password for user %s changed"},
+      {TulkEvent::NetworkRestart, "@&!*@*@(qob.user.tulk.network.restart)Restarting %s"},
+      {TulkEvent::FactoryNetworkRestored,
+       "@&!*@*@(qob.user.tulk.factory.network.restored)Restoring factory network settings"},
+      {TulkEvent::RestartingHostAgents,
+       "@&!*@*@(qob.user.tulk.restarting.hostagents)Restarting host agents"},
+      {TulkEvent::RestoreFactoryDefaults,
+       "@&!*@*@(qob.user.tulk.restore.factory.defaults)Restoring factory defaults"},
+      {TulkEvent::RebootHost, "@&!*@*@(qob.user.tulk.reboot.host)Rebooting host"},
+      {TulkEvent::ShutdownHost, "@&!*@*@(qob.user.tulk.shutdown.host)Shutting down host"},
+  };
+  for (const Case& c : cases) {
+    EXPECT_EQ(Tulk::EventMessage(c.event), c.message);
+  }
+}
+
+}  // namespace
