@@ -207,7 +207,7 @@ void WriteIpConfig(json& nic, const IpConfig& config, const json& dhcpOffer) {
   if (mode == "dhcp" && oldMode != "dhcp") {
     // A new DHCP client is bound at once when the network has a DHCP
     // server (the state's "dhcpOffer"), and waits without a lease otherwise.
-    if (dhcpOffer.is_object()) {
+    if (dhcpOffer.is_object() && !dhcpOffer.empty()) {
       json lease = dhcpOffer;
       lease["bound"] = true;
       nic["dhcpLease"] = std::move(lease);

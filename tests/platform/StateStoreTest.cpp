@@ -1,0 +1,272 @@
+// The simulated host's state file: persistence, re-reading, validation,
+// fault injection and concurrent changes.
+
+#include <gtest/gtest.h>
+#include <spawn.h>
+#include <sys/wait.h>
+#include <unistd.h>
+
+#include <fstream>
+#include <functional>
+#include <sstream>
+
+#include "SimTestSupport.h"
+#include "platform/api/AdvancedOption.h"
+#include "platform/api/Authentication.h"
+#include "platform/api/BrlAudit.h"
+#include "platform/api/DnsConfigImpl.h"
+#include "platform/api/Host.h"
+#include "platform/api/HostMgrException.h"
+#include "platform/api/HykCtlExec.h"
+#include "platform/api/NetworkInfoImpl.h"
+#include "platform/api/PnicImpl.h"
+#include "platform/api/PortGroupImpl.h"
+#include "platform/api/PortsetImpl.h"
+#include "platform/api/Preference.h"
+#include "platform/api/QobUserLib.h"
+#include "platform/api/SystemInformation.h"
+#include "platform/sim/DemoHost.h"
+#include "platform/sim/SimHost.h"
+
+extern char** environ;
+
+namespace {
+
+using HostMgr::Lib::HostMgrException;
+using nlohmann::json;
+using SimTest::ScratchHost;
+
+std::string FileText(const std::filesystem::path& path) {
+  std::ifstream in(path);
+  std::stringstream text;
+  text << in.rdbuf();
+  return text.str();
+}
+
+TEST(StateStore, ChangesPersistAcrossRuns) {
+  ScratchHost host;
+  HykCtl::Adv::UserAdvancedOptionImpl().SetUserOption("/UserVars/TulkTimeOut", 120);
+  HykCtl::Network::DnsConfigImpl().SetFqdn("edge-7.lab.example.net");
+  EXPECT_EQ(host.ReadState()["advancedOptions"]["/UserVars/TulkTimeOut"], 120);
+
+  Sim::SimHost::Instance().Reset();  // as a new process would start
+  EXPECT_EQ(HykCtl::Adv::UserAdvancedOptionImpl().GetUserOption("/UserVars/TulkTimeOut"), 120);
+  HykCtl::Network::DnsConfigImpl dns;
+  EXPECT_EQ(dns.GetHostname(), "edge-7");
+  EXPECT_EQ(dns.GetDomain(), "lab.example.net");
+}
+
+TEST(StateStore, RereadsOnlyAReplacedFile) {
+  ScratchHost host;
+  HykCtl::Adv::UserAdvancedOptionImpl options;
+  const auto generation = Sim::SimHost::Instance().Generation();
+  for (int i = 0; i < 5; ++i) {
+    options.GetUserOption("/UserVars/TulkTimeOut");
+  }
+  EXPECT_EQ(Sim::SimHost::Instance().Generation(), generation);
+
+  json state = host.ReadState();
+  state["advancedOptions"]["/UserVars/TulkTimeOut"] = 42;
+  host.WriteState(state);
+  EXPECT_EQ(options.GetUserOption("/UserVars/TulkTimeOut"), 42);
+  EXPECT_NE(Sim::SimHost::Instance().Generation(), generation);
+}
+
+TEST(StateStore, MalformedReplacementKeepsLastGoodStateAndIsNeverOverwritten) {
+  ScratchHost host;
+  HykCtl::Adv::UserAdvancedOptionImpl options;
+  options.GetUserOption("/UserVars/TulkTimeOut");
+  std::ofstream(host.StateFile()) << "{\"advancedOptions\": ";
+  EXPECT_EQ(options.GetUserOption("/UserVars/TulkTimeOut"), 600);
+  EXPECT_THROW(options.SetUserOption("/UserVars/TulkTimeOut", 5), HostMgrException);
+  EXPECT_EQ(FileText(host.StateFile()), "{\"advancedOptions\": ");
+}
+
+TEST(StateStore, ValidationNamesTheOffendingField) {
+  const struct {
+    std::function<void(json&)> edit;
+    const char* message;
+  } cases[] = {
+      {[](json& s) { s["network"]["pnics"][1]["linkUp"] = "yes"; },
+       "network.pnics[1].linkUp must be a boolean"},
+      {[](json& s) { s["network"]["pnics"][0].erase("name"); }, "network.pnics[0].name is missing"},
+      {[](json& s) { s["network"]["hykernelNics"][0]["ipv4"]["address"] = "10.0.1"; },
+       "network.hykernelNics[0].ipv4.address must be an IPv4 address text"},
+      {[](json& s) { s["network"]["hykernelNics"][0]["ipv4"]["mode"] = "auto"; },
+       "network.hykernelNics[0].ipv4.mode must be"},
+      {[](json& s) { s["network"]["switches"][0]["type"] = "virtual"; },
+       "network.switches[0].type must be"},
+      {[](json& s) { s["network"]["dns"]["nameServers"][1] = "dns.example.net"; },
+       "network.dns.nameServers[1] must be an IP address text"},
+      {[](json& s) { s["advancedOptions"]["/UserVars/TulkTimeOut"] = "600"; },
+       "advancedOptions[\"/UserVars/TulkTimeOut\"] must be an integer"},
+      {[](json& s) { s["hardware"]["memory"]["totalPages"] = 1.5; },
+       "hardware.memory.totalPages must be an integer"},
+      {[](json& s) { s["faults"]["HSI_Get"] = 3; }, "faults[\"HSI_Get\"] must be a string"},
+      {[](json& s) {
+         s["commands"]["reboot"] = {{"delayMs", "10"}};
+       },
+       "commands[\"reboot\"].delayMs must be an integer"},
+      {[](json& s) { s["services"]["SSH"]["running"] = 1; },
+       "services[\"SSH\"].running must be a boolean"},
+      {[](json& s) { s["vms"] = json::object(); }, "vms must be an array"},
+      {[](json& s) { s = json::array(); }, "the document must be a JSON object"},
+  };
+  for (const auto& c : cases) {
+    json state = Sim::DemoHostState();
+    c.edit(state);
+    try {
+      Sim::ValidateState(state);
+      ADD_FAILURE() << "accepted; expected: " << c.message;
+    } catch (const Sim::StateError& error) {
+      EXPECT_NE(std::string(error.what()).find(c.message), std::string::npos)
+          << error.what() << "\nexpected: " << c.message;
+    }
+  }
+  EXPECT_NO_THROW(Sim::ValidateState(Sim::DemoHostState()));
+  EXPECT_NO_THROW(Sim::ValidateState(json::object())) << "every section is optional";
+}
+
+// Runs Preference_Init in a child: its exit status and standard error.
+SimTest::Finished PreferenceInitInChild() {
+  int err[2];
+  EXPECT_EQ(pipe(err), 0);
+  pid_t pid = fork();
+  if (pid == 0) {
+    dup2(err[1], 2);
+    Sim::SimHost::Instance().Reset();
+    Preference_Init();
+    _exit(0);
+  }
+  close(err[1]);
+  SimTest::Finished finished;
+  char buffer[1024];
+  for (ssize_t got; (got = read(err[0], buffer, sizeof buffer)) > 0;) {
+    finished.err.append(buffer, static_cast<std::size_t>(got));
+  }
+  close(err[0]);
+  int status = 0;
+  waitpid(pid, &status, 0);
+  finished.status = WIFEXITED(status) ? WEXITSTATUS(status) : -1;
+  return finished;
+}
+
+TEST(StateStore, MalformedFileStopsStartupWithOneLineAndExitOne) {
+  ScratchHost host(std::string(R"({"network": {"pnics": [{"name": "hynic0", "linkUp": "up"}]}})"));
+  const std::string before = FileText(host.StateFile());
+  SimTest::Finished run = PreferenceInitInChild();
+  EXPECT_EQ(run.status, 1);
+  EXPECT_NE(run.err.find("malformed host state: network.pnics[0].linkUp must be a boolean"),
+            std::string::npos)
+      << run.err;
+  EXPECT_EQ(std::count(run.err.begin(), run.err.end(), '\n'), 1) << run.err;
+  EXPECT_EQ(FileText(host.StateFile()), before);
+
+  std::ofstream(host.StateFile()) << "not json";
+  run = PreferenceInitInChild();
+  EXPECT_EQ(run.status, 1);
+  EXPECT_NE(run.err.find("malformed host state: not valid JSON"), std::string::npos) << run.err;
+}
+
+TEST(StateStore, RefusesToRunAgainstTheRealRoot) {
+  ScratchHost host;
+  setenv("TULK_ROOT", "/", 1);
+  SimTest::Finished run = PreferenceInitInChild();
+  EXPECT_EQ(run.status, 1);
+  EXPECT_NE(run.err.find("TULK_ROOT"), std::string::npos) << run.err;
+  setenv("TULK_ROOT", host.Root().c_str(), 1);
+  EXPECT_EQ(PreferenceInitInChild().status, 0);
+}
+
+TEST(StateStore, FaultsReachEveryKindOfOperation) {
+  using Call = std::function<void()>;
+  const struct {
+    const char* fault;
+    Call call;
+  } cases[] = {
+      {"HykCtl::Network::NetworkInfoImpl::GetPnics",
+       [] { HykCtl::Network::NetworkInfoImpl().GetPnics(); }},
+      {"HykCtl::Network::PnicImpl::PnicImpl", [] { HykCtl::Network::PnicImpl("hynic0"); }},
+      {"HykCtl::Network::PortsetImpl::IsValidVirtualSwitch",
+       [] { HykCtl::Network::PortsetImpl::IsValidVirtualSwitch("vSwitch0"); }},
+      {"HykCtl::Network::PortGroupImpl::SetVlanId",
+       [] { HykCtl::Network::PortGroupImpl("Management Network").SetVlanId(12); }},
+      {"HykCtl::Network::DnsConfigImpl::SaveConfig",
+       [] { HykCtl::Network::DnsConfigImpl().SaveConfig(); }},
+      {"HostMgr::HostFactory::GetHost", [] { HostMgr::HostFactory::GetHost(); }},
+      {"HostMgr::Host::GetStorageInfo", [] { HostMgr::HostFactory::GetHost()->GetStorageInfo(); }},
+      {"HostMgr::Authentication::StoreUserAccountsToCs",
+       [] { HostMgr::Authentication::StoreUserAccountsToCs(); }},
+      {"HostMgr::Authentication::LookupSmartCardTokens",
+       [] { HostMgr::Authentication::LookupSmartCardTokens(); }},
+      {"HykCtl::Util::HykCtl_Exec", [] { HykCtl::Util::HykCtl_Exec("true", false, true, false); }},
+      {"HSI_Get",
+       [] {
+         HSI_SystemVersion version;
+         HSI_Get(HSI_NODE_system_version, &version, sizeof version);
+       }},
+      {"PortGroupImpl::GetVlanId",
+       [] { HykCtl::Network::PortGroupImpl("Management Network").GetVlanId(); }},
+  };
+  for (const auto& c : cases) {
+    ScratchHost host([&](json& s) { s["faults"][c.fault] = "injected failure"; });
+    try {
+      c.call();
+      ADD_FAILURE() << c.fault << " did not fail";
+    } catch (const HostMgrException& error) {
+      EXPECT_STREQ(error.what(), "injected failure") << c.fault;
+    }
+  }
+}
+
+TEST(StateStore, FailedChangeLeavesTheStateAlone) {
+  ScratchHost host([](json& s) { s["faults"]["PortGroupImpl::SetVlanId"] = "busy"; });
+  const std::string before = FileText(host.StateFile());
+  EXPECT_THROW(HykCtl::Network::PortGroupImpl("Management Network").SetVlanId(7), HostMgrException);
+  EXPECT_THROW(HykCtl::Network::PortGroupImpl("VM Network").SetVlanId(5000), HostMgrException)
+      << "an invalid id fails inside the change";
+  EXPECT_EQ(FileText(host.StateFile()), before);
+}
+
+TEST(StateStore, FaultsOfCFunctionsBecomeErrorCodes) {
+  ScratchHost host([](json& s) {
+    s["faults"]["QobUserLib_Init"] = "17";
+    s["faults"]["BrlAudit_LogList"] = "audit log full";
+  });
+  EXPECT_EQ(QobUserLib_Init(), 17);
+  EXPECT_EQ(QobUserLib_AddQob("@&!*@*@(qob.user.tulk.reboot.host)Rebooting host", nullptr, 0), 1)
+      << "the facility did not open";
+  EXPECT_NE(BrlAudit_LogList("tulk.login", "tulk", "root", BRL_AUDIT_SUCCESS, nullptr, 0), 0);
+  EXPECT_TRUE(host.Records("events.jsonl").empty());
+  EXPECT_TRUE(host.Records("audit.jsonl").empty());
+}
+
+TEST(StateStore, ConcurrentChangesFromToolsAndTheConsoleAreAllKept) {
+  ScratchHost host;
+  constexpr int kWriters = 3;
+  constexpr int kToolRuns = 15;
+  constexpr int kConsoleChanges = 40;
+  const std::string loop = "i=0; while [ $i -lt " + std::to_string(kToolRuns) + " ]; do '" +
+                           (host.Root() / "sbin/backup.sh").string() +
+                           "' 0 >/dev/null; i=$((i+1)); done";
+  std::vector<pid_t> writers;
+  for (int w = 0; w < kWriters; ++w) {
+    const char* argv[] = {"/bin/sh", "-c", loop.c_str(), nullptr};
+    pid_t pid = -1;
+    ASSERT_EQ(posix_spawn(&pid, "/bin/sh", nullptr, nullptr, const_cast<char**>(argv), environ), 0);
+    writers.push_back(pid);
+  }
+  for (int i = 0; i < kConsoleChanges; ++i) {
+    HostMgr::Authentication::StoreUserAccountsToCs();
+  }
+  for (pid_t pid : writers) {
+    int status = 0;
+    waitpid(pid, &status, 0);
+    EXPECT_TRUE(WIFEXITED(status) && WEXITSTATUS(status) == 0);
+  }
+  const json state = host.ReadState();
+  EXPECT_EQ(state["configBackups"], kWriters * kToolRuns);
+  EXPECT_EQ(state["users"]["configStoreSaves"], kConsoleChanges);
+}
+
+}  // namespace
