@@ -1,0 +1,48 @@
+#pragma once
+/// Console logins and password changes through PAM.
+///
+/// Every call runs one PAM transaction for the service "tulk" (a real host
+/// installs dist/pam.d/tulk as /etc/pam.d/tulk), with PAM_SILENT on every
+/// call, and ends it with pam_end() and the last status. The passwords
+/// reach the modules through PamConversation (screens/PamConversation.h),
+/// which answers the modules' prompts from the texts given here.
+///
+/// Results are PAM status codes (security/pam_appl.h): PAM_SUCCESS (0),
+/// PAM_NEW_AUTHTOK_REQD (12, the password has expired), PAM_PERM_DENIED
+/// (6), or any other failure.
+
+#include <string>
+
+namespace Tulk {
+
+class PamAuthenticator {
+ public:
+  /// The console's PAM service.
+  static constexpr char kService[] = "tulk";
+
+  /// Transactions for `service` (the console always uses "tulk").
+  explicit PamAuthenticator(std::string service = kService);
+
+  /// Checks `user` and `password` (or a smart-card login id and PIN):
+  /// pam_authenticate, and only when that succeeds pam_acct_mgmt. Returns
+  /// the status of the last call made, so an expired password (12) is
+  /// reported by the account check after a correct password. Also the
+  /// check of the old password before a change.
+  int Authenticate(const std::string& user, const std::string& password) const;
+
+  /// Changes the password of `user` from `oldPassword` to `newPassword`:
+  /// pam_authenticate and pam_acct_mgmt, where PAM_SUCCESS and
+  /// PAM_NEW_AUTHTOK_REQD both pass; then pam_chauthtok and pam_setcred
+  /// with PAM_REFRESH_CRED. Returns PAM_SUCCESS only when pam_chauthtok
+  /// and pam_setcred both succeeded; otherwise the status of the step that
+  /// failed.
+  int ChangePassword(const std::string& user, const std::string& oldPassword,
+                     const std::string& newPassword) const;
+
+  const std::string& Service() const { return service_; }
+
+ private:
+  std::string service_;
+};
+
+}  // namespace Tulk

@@ -1,0 +1,37 @@
+#pragma once
+/// "Shut Down/Restart": shuts the host down (F2) or restarts it (F11),
+/// optionally terminating running virtual machines.
+///
+/// A dialog 60 x 19 with a header of 12 rows (title 170, text 171) and one
+/// check box, "Forcefully terminate running VMs, if any ..." (unticked),
+/// toggled with Space. F2 logs "Shutting down host", posts the event
+/// "qob.user.tulk.shutdown.host" and runs ShutdownConfirmDialog; F11 logs
+/// "Rebooting host", posts "qob.user.tulk.reboot.host" and runs
+/// RebootConfirmDialog. A confirmation dialog returns only when the host's
+/// command could not be run, and the operator is back here. Esc leaves.
+///
+/// Opened from the welcome screen (F12 after the login) and from the System
+/// Customization menu.
+
+#include "toolkit/CheckItem.h"
+#include "toolkit/Dialog.h"
+
+namespace Tulk {
+
+class ItemList;
+
+class ShutdownDialog : public Dialog {
+ public:
+  explicit ShutdownDialog(Frame* owner);
+
+  /// The key loop; returns 0 (nothing changed) when left with Esc.
+  int Run() override;
+
+ private:
+  void PowerAction(bool reboot);
+
+  CheckItem terminate_;
+  ItemList* list_ = nullptr;
+};
+
+}  // namespace Tulk

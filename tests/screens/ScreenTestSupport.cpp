@@ -1,0 +1,37 @@
+#include "ScreenTestSupport.h"
+
+#include <fstream>
+
+#include "platform/sim/DemoHost.h"
+
+namespace TulkTest {
+
+nlohmann::json DemoHostState() {
+  return Sim::DemoHostState();
+}
+
+std::vector<nlohmann::json> SimRecords(const std::filesystem::path& root, const std::string& file) {
+  std::vector<nlohmann::json> records;
+  std::ifstream in(root / "var/log/tulk-sim" / file);
+  std::string line;
+  while (std::getline(in, line)) {
+    if (!line.empty()) {
+      records.push_back(nlohmann::json::parse(line, nullptr, false));
+    }
+  }
+  return records;
+}
+
+nlohmann::json ReadHostState(const std::filesystem::path& stateFile) {
+  std::ifstream in(stateFile);
+  return nlohmann::json::parse(in, nullptr, false);
+}
+
+void WriteRootFile(const std::filesystem::path& root, const std::string& path,
+                   const std::string& text) {
+  std::filesystem::path file = root / std::filesystem::path(path).relative_path();
+  std::filesystem::create_directories(file.parent_path());
+  std::ofstream(file) << text;
+}
+
+}  // namespace TulkTest

@@ -1,0 +1,34 @@
+#pragma once
+/// Helpers shared by the screen tests: the demo host's state to start a
+/// custom host from, and the simulated host's record files.
+///
+///   nlohmann::json host = TulkTest::DemoHostState();
+///   host["hardware"]["vendor"] = "Acme";
+///   TulkTest::Options options;
+///   options.hostState = host.dump();
+
+#include <filesystem>
+#include <string>
+#include <vector>
+
+#include <nlohmann/json.hpp>
+
+namespace TulkTest {
+
+/// The built-in demo host's state (the simulated host's default).
+nlohmann::json DemoHostState();
+
+/// The JSON lines of one of the simulated host's record files under
+/// "<root>/var/log/tulk-sim/" ("audit.jsonl", "events.jsonl",
+/// "commands.jsonl"); empty when the file does not exist.
+std::vector<nlohmann::json> SimRecords(const std::filesystem::path& root, const std::string& file);
+
+/// The host state file as it is now.
+nlohmann::json ReadHostState(const std::filesystem::path& stateFile);
+
+/// Writes `text` to `path` under `root` (an absolute host path such as
+/// "/var/run/brimlo/show-tulk-login"), creating the folders.
+void WriteRootFile(const std::filesystem::path& root, const std::string& path,
+                   const std::string& text = "");
+
+}  // namespace TulkTest
