@@ -1,0 +1,79 @@
+#include "screens/MenuEntries.h"
+
+#include "host/HostTools.h"
+#include "host/ManagementNetwork.h"
+#include "include/Constants.h"
+#include "platform/api/AdvancedOption.h"
+#include "platform/api/HostMgrException.h"
+
+namespace Tulk {
+namespace {
+
+bool HasNetworkBootOption() {
+  try {
+    return HykCtl::Adv::UserAdvancedOptionImpl().HasUserOption(kPxeBootOption);
+  } catch (const HostMgr::Lib::HostMgrException&) {
+    return false;
+  }
+}
+
+bool ManagementNicUp() {
+  std::unique_ptr<HykCtl::Network::HykNicImpl> nic = GetManagementInterface();
+  if (!nic) {
+    return false;
+  }
+  try {
+    return nic->IsEnabled();
+  } catch (const HostMgr::Lib::HostMgrException&) {
+    return false;
+  }
+}
+
+}  // namespace
+
+MenuHostState ReadMenuHostState() {
+  MenuHostState state;
+  state.lockdownEnabled = OskCmdGetFlag("osksvc/auth/lockdown_is_enabled");
+  if (!state.lockdownEnabled) {
+    state.lockdownPossible = OskCmdGetFlag("osksvc/auth/lockdown_is_possible");
+  }
+  state.managementNicUp = ManagementNicUp();
+  state.networkBoot = HasNetworkBootOption();
+  return state;
+}
+
+std::vector<MenuEntry> BuildMenuEntries(const MenuHostState& state, bool localConsole) {
+  const bool network = state.managementNicUp;
+  std::vector<MenuEntry> entries = {
+      {kEntryPassword, true},
+      {kEntryLockdown, state.lockdownEnabled || state.lockdownPossible},
+      {kEntrySeparator, false},
+      {kEntryManagementNetwork, network},
+      {kEntryRestartNetwork, network},
+      {kEntryTestNetwork, network},
+      {kEntryNetworkRestore, true},
+      {kEntrySeparator, false},
+  };
+  if (localConsole) {
+    entries.push_back({kEntryKeyboard, true});
+  }
+  entries.insert(entries.end(), {
+                                    {kEntryTroubleshooting, true},
+                                    {kEntrySeparator, false},
+                                    {kEntrySystemLogs, true},
+                                    {kEntrySeparator, false},
+                                    {kEntrySupportInformation, true},
+                                    {kEntrySeparator, false},
+                                    {kEntryResetConfiguration, !state.networkBoot},
+                                });
+  return entries;
+}
+
+std::string EntryLabel(const std::string& text, bool enabled) {
+  if (enabled) {
+    return text;
+  }
+  return "{color:dark-grey}" + text + "{/color}";
+}
+
+}  // namespace Tulk

@@ -1,0 +1,91 @@
+#include "screens/SupportValues.h"
+
+#include <syslog.h>
+
+#include <cstdio>
+#include <sstream>
+
+#include "host/CommandRunner.h"
+#include "render/HostValues.h"
+#include "runtime/HostPath.h"
+#include "runtime/SystemLog.h"
+
+namespace Tulk {
+namespace {
+
+constexpr char kOpenssl[] = "/bin/openssl";
+constexpr char kSshKeygen[] = "/usr/lib/brimlo/openssh/bin/ssh-keygen";
+
+std::string WithoutTrailingSpace(std::string text) {
+  while (!text.empty() && (text.back() == '\n' || text.back() == '\r' || text.back() == ' ' ||
+                           text.back() == '\t')) {
+    text.pop_back();
+  }
+  return text;
+}
+
+}  // namespace
+
+std::string ParseThumbprint(const std::string& output) {
+  unsigned digestBits = 0;
+  char value[256] = {};
+  if (std::sscanf(output.c_str(), "SHA%u Fingerprint=%255s", &digestBits, value) != 2) {
+    return {};
+  }
+  return value;
+}
+
+std::string SecondWord(const std::string& output) {
+  std::istringstream words(output);
+  std::string word;
+  words >> word;
+  word.clear();
+  words >> word;
+  return word;
+}
+
+std::string CertificateThumbprint(unsigned bits) {
+  char option[16];
+  std::snprintf(option, sizeof option, "-SHA%u", bits);
+  char output[kCaptureBufferSize] = {};
+  char error[kCaptureBufferSize] = {};
+  std::int32_t outputLength = kCaptureBufferSize;
+  std::int32_t errorLength = kCaptureBufferSize;
+  const int rc = RunCommand(
+      kOpenssl,
+      {"openssl", "x509", "-in", HostPath(kHostCertificatePath), "-noout", "-fingerprint", option},
+      output, &outputLength, error, &errorLength, nullptr, 0, 0);
+  std::string thumbprint;
+  if (rc == 0) {
+    thumbprint = ParseThumbprint(std::string(output, static_cast<std::size_t>(outputLength)));
+  }
+  if (thumbprint.empty()) {
+    Log(LOG_ERR, "Failed to generate the host's %s SSL thumbprint", option + 1);
+  }
+  return thumbprint;
+}
+
+std::string HostKeyFingerprint(const std::string& keyPath) {
+  char output[kCaptureBufferSize] = {};
+  char error[kCaptureBufferSize] = {};
+  std::int32_t outputLength = kCaptureBufferSize;
+  std::int32_t errorLength = kCaptureBufferSize;
+  const int rc = RunCommand(kSshKeygen, {"ssh-keygen", "-l", "-f", HostPath(keyPath)}, output,
+                            &outputLength, error, &errorLength, nullptr, 0, 0);
+  if (rc != 0) {
+    Log(LOG_ERR, "SSH Key Fingerprint generation failed: %s",
+        WithoutTrailingSpace(std::string(error, static_cast<std::size_t>(errorLength))).c_str());
+    return {};
+  }
+  return SecondWord(std::string(output, static_cast<std::size_t>(outputLength)));
+}
+
+void RegisterSupportValueProviders() {
+  RegisterValueProvider("ssl-thumbprint-sha-1", [] { return CertificateThumbprint(1); });
+  RegisterValueProvider("ssl-thumbprint-sha-256", [] { return CertificateThumbprint(256); });
+  RegisterValueProvider("ssl-thumbprint-sha-512", [] { return CertificateThumbprint(512); });
+  RegisterValueProvider("ssh-dsa-fingerprint", [] { return HostKeyFingerprint(kDsaHostKeyPath); });
+  RegisterValueProvider("ssh-rsa-fingerprint", [] { return HostKeyFingerprint(kRsaHostKeyPath); });
+}
+
+}  // namespace Tulk
