@@ -41,6 +41,12 @@ Window::DrawBatch::~DrawBatch() {
 }
 
 void Window::FinishOutput() {
+  // Typed-ahead keys are dropped before the new state reaches the screen,
+  // so that a key pressed after the operator saw it is kept.
+  if (g_flushPending) {
+    g_flushPending = false;
+    flushinp();
+  }
   if (newscr != nullptr) {
     // A hidden cursor is left where drawing ended instead of being moved
     // back: fewer bytes on a slow line.
@@ -50,10 +56,6 @@ void Window::FinishOutput() {
     }
   }
   doupdate();
-  if (g_flushPending) {
-    g_flushPending = false;
-    flushinp();
-  }
 }
 
 Window::Window(int column, int row, int width, int height, int background, int foreground)
@@ -131,6 +133,7 @@ void Window::Redraw(bool active) {
     ShowCursor(false);
   }
   active_ = active;
+  drawn_ = true;
   if (window_ != nullptr) {
     ApplyBackground(active);
     werase(window_);
@@ -178,7 +181,13 @@ void Window::Touch() {
 }
 
 void Window::Update() {
-  if (window_ == nullptr) {
+  const Window* top = this;
+  while (top->parent_ != nullptr) {
+    top = top->parent_;
+  }
+  // A window being built (before its frame is first drawn) stays off the
+  // screen.
+  if (window_ == nullptr || !top->drawn_) {
     return;
   }
   Touch();
@@ -259,11 +268,13 @@ void Window::DrawDecorations() {
     return;
   }
   SetDrawingAttribute();
+  // The wide-character calls: the narrow ones keep only 8 bits of the
+  // colour pair, and pair numbers reach 1800.
   if (boxed_) {
-    box(window_, 0, 0);
+    wborder_set(window_, nullptr, nullptr, nullptr, nullptr, nullptr, nullptr, nullptr, nullptr);
   }
   for (const Line& line : lines_) {
-    mvwhline(window_, line.row, line.column, 0, line.length);
+    mvwhline_set(window_, line.row, line.column, WACS_HLINE, line.length);
   }
 }
 

@@ -19,7 +19,9 @@
 ///
 /// Drawing reaches the terminal once per outermost drawing operation: the
 /// windows are copied to the virtual screen as they are drawn and curses
-/// sends only the cells that changed when the operation ends.
+/// sends only the cells that changed when the operation ends. Nothing of a
+/// top-level window reaches the terminal before its first Redraw(), so a
+/// frame can fill its texts in its constructor.
 ///
 /// The terminal cursor is process-wide state: MoveCursor() and
 /// ShowCursor() remember it; a top-level window saves it when it is dimmed
@@ -74,7 +76,8 @@ class Window {
   void SetColors(int background, int foreground);
   /// Marks every line of the window as changed.
   void Touch();
-  /// Touch(), then refresh the window on the terminal.
+  /// Touch(), then refresh the window on the terminal (once its top-level
+  /// window has been drawn).
   void Update();
   /// Has the terminal repaint the window's lines and its children's.
   void RedrawLines();
@@ -167,6 +170,7 @@ class Window {
   int foreground_ = 7;
   std::vector<Window*> children_;
   bool active_ = true;
+  bool drawn_ = false;
   bool boxed_ = false;
   std::vector<KeptText> texts_;
   std::vector<Line> lines_;

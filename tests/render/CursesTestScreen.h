@@ -21,9 +21,6 @@ struct CellInfo {
   int background = -1;
   int foreground = -1;
   bool standout = false;
-  /// Line-drawing character of the alternate character set ("l" is a
-  /// corner, "q" a horizontal line).
-  bool altCharset = false;
 };
 
 class CursesTestScreen {
@@ -73,7 +70,6 @@ inline CellInfo CellAt(WINDOW* window, int row, int col) {
   std::snprintf(bytes, sizeof bytes, "%lc", static_cast<wint_t>(text[0]));
   info.text = bytes;
   info.standout = (attrs & A_STANDOUT) != 0;
-  info.altCharset = (attrs & A_ALTCHARSET) != 0;
   if (pair > 0) {
     info.background = (pair - 1) / COLORS;
     info.foreground = (pair - 1) % COLORS;

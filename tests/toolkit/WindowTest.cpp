@@ -21,10 +21,9 @@ std::pair<int, int> ScreenColors(int row, int col) {
   return {cell.background, cell.foreground};
 }
 
-// A line-drawing character ("l" corner, "q" horizontal line) on the screen.
-bool IsLine(int row, int col, const char* which) {
-  TulkTest::CellInfo cell = CellAt(curscr, row, col);
-  return cell.altCharset && cell.text == which;
+// The line-drawing character on the screen.
+std::string LineAt(int row, int col) {
+  return CellAt(curscr, row, col).text;
 }
 
 class TestMenu : public RootWindow {
@@ -76,7 +75,7 @@ TEST_F(WindowTest, DialogDrawsItsPartsInTheirColoursAndDimsAsAWhole) {
   dialog.SetFooter(Dialog::kOkFooter);
   dialog.Redraw(true);
   EXPECT_EQ(ScreenColors(6, 10), std::make_pair(kBlack, kWhite));  // box corner
-  EXPECT_TRUE(IsLine(6, 10, "l"));
+  EXPECT_EQ(LineAt(6, 10), "\u250c");
   EXPECT_EQ(ScreenColors(7, 13), std::make_pair(kDarkGrey, kWhite));  // title
   EXPECT_EQ(CellAt(curscr, 7, 13).text, "T");
   EXPECT_EQ(ScreenColors(13, 11), std::make_pair(kYellow, kWhite));     // body
@@ -141,9 +140,10 @@ TEST_F(WindowTest, RootWindowLaysOutItsPanesAndShowsTheVersionLine) {
   EXPECT_EQ(menu.Description().Height(), 18);
 
   menu.Show();
-  EXPECT_TRUE(IsLine(0, 0, "l"));
-  EXPECT_TRUE(IsLine(2, 1, "q"));  // the line on row 2
-  EXPECT_TRUE(IsLine(2, 78, "q"));
+  EXPECT_EQ(LineAt(0, 0), "\u250c");
+  EXPECT_EQ(ScreenColors(0, 0), std::make_pair(kLightGrey, kWhite));
+  EXPECT_EQ(LineAt(2, 1), "\u2500");  // the line on row 2
+  EXPECT_EQ(LineAt(2, 78), "\u2500");
   EXPECT_EQ(CellAt(curscr, 1, 3).text, "M");
   EXPECT_EQ(ScreenColors(1, 3), std::make_pair(kYellow, kBlack));
   EXPECT_EQ(ScreenColors(5, 45), std::make_pair(kDarkGrey, kLightGrey));

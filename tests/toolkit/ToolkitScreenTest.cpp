@@ -1,0 +1,241 @@
+// The toolkit on a real terminal: the test-only demo program runs the
+// console's start-up and key loop and opens one scene; the screen is read
+// through the terminal emulator.
+
+#include <gtest/gtest.h>
+
+#include <string>
+
+#include "TestConsole.h"
+#include "include/ColorNumbers.h"
+
+namespace {
+
+using namespace std::chrono_literals;
+using namespace Tulk;
+using TulkTest::Options;
+using TulkTest::TestConsole;
+
+Options Scene(const char* scene) {
+  Options options;
+  options.program = TULK_TEST_TOOLKIT_DEMO_BINARY;
+  options.hostTools = false;
+  options.env["TULK_DEMO_SCENE"] = scene;
+  return options;
+}
+
+// `count` cells of a row from `col` on (Row() is UTF-8, so line-drawing
+// characters make its byte offsets differ from columns).
+std::string Cells(const TestConsole& console, int row, int col, int count) {
+  std::string text;
+  for (int c = col; c < col + count; ++c) {
+    text += console.At(row, c).text;
+  }
+  return text;
+}
+
+::testing::AssertionResult HasColors(const TestConsole& console, int row, int col, int bg, int fg) {
+  TulkTest::Cell cell = console.At(row, col);
+  if (cell.bg == bg && cell.fg == fg) {
+    return ::testing::AssertionSuccess();
+  }
+  return ::testing::AssertionFailure() << "cell " << row << "," << col << " is " << cell.bg << "/"
+                                       << cell.fg << ", expected " << bg << "/" << fg << "\n"
+                                       << console.Dump();
+}
+
+TEST(ToolkitScreen, LowDialogIsCentredWithTitleHeaderAndBody) {
+  TestConsole console(Scene("dialog"));
+  ASSERT_TRUE(console.WaitForText("Demo Dialog"));
+  console.WaitQuiet();
+  // 60 x 9 with a header of 6 on 80 x 25: column 10, row 8.
+  EXPECT_EQ(console.At(8, 10).text, "\u250c");
+  EXPECT_EQ(console.At(16, 69).text, "\u2518");
+  EXPECT_TRUE(HasColors(console, 8, 10, kBlack, kWhite));
+  EXPECT_EQ(Cells(console, 9, 13, 11), "Demo Dialog");
+  EXPECT_TRUE(HasColors(console, 9, 13, kDarkGrey, kWhite));
+  EXPECT_EQ(Cells(console, 11, 13, 23), "Header text of the demo");
+  EXPECT_TRUE(HasColors(console, 11, 13, kDarkGrey, kLightGrey));
+  // The body is rows 14 to 16: the footer on its middle row, no client area.
+  EXPECT_TRUE(HasColors(console, 13, 40, kDarkGrey, kWhite));
+  EXPECT_TRUE(HasColors(console, 14, 40, kYellow, kWhite));
+  EXPECT_EQ(Cells(console, 15, 44, 25), "<Enter> OK  <Esc> Cancel ");
+  EXPECT_TRUE(HasColors(console, 15, 44, kYellow, kBlack));
+  EXPECT_TRUE(HasColors(console, 15, 52, kYellow, kDarkGrey));
+  console.Key("Esc");
+  EXPECT_TRUE(console.WaitForText("result: 0"));
+}
+
+TEST(ToolkitScreen, OwnerIsDimmedWhileADialogRunsAndRestoredAfter) {
+  TestConsole console(Scene("dialog"));
+  ASSERT_TRUE(console.WaitForText("Demo Dialog"));
+  console.WaitQuiet();
+  EXPECT_TRUE(HasColors(console, 1, 2, kBlack, kDarkGrey));
+  EXPECT_TRUE(HasColors(console, 0, 0, kBlack, kDarkGrey));
+  console.Key("Enter");
+  ASSERT_TRUE(console.WaitForText("result: 1"));
+  console.WaitQuiet();
+  EXPECT_TRUE(HasColors(console, 1, 2, kBlack, kWhite));
+  EXPECT_TRUE(HasColors(console, 0, 0, kBlack, kWhite));
+  EXPECT_FALSE(console.Contains("Demo Dialog"));
+}
+
+TEST(ToolkitScreen, KeysTypedWhileADialogClosesAreDiscarded) {
+  TestConsole console(Scene("message"));
+  ASSERT_TRUE(console.WaitForText("Configure Password: Error"));
+  console.WaitQuiet();
+  console.Send("\rxy");
+  ASSERT_TRUE(console.WaitForText("result: 1"));
+  console.WaitQuiet(300ms);
+  EXPECT_FALSE(console.Contains("key:")) << console.Dump();
+  console.Type("z");
+  EXPECT_TRUE(console.WaitForText("key: z"));
+}
+
+TEST(ToolkitScreen, MessageDialogIgnoresEscAndClosesWithEnter) {
+  TestConsole console(Scene("message"));
+  ASSERT_TRUE(console.WaitForText("The new password and the confirmed password do not"));
+  console.Key("Esc");
+  console.Type("n");
+  console.WaitQuiet(300ms);
+  EXPECT_TRUE(console.Contains("Configure Password: Error"));
+  EXPECT_FALSE(console.Contains("result:"));
+  console.Key("Enter");
+  EXPECT_TRUE(console.WaitForText("result: 1"));
+}
+
+TEST(ToolkitScreen, MonochromeDimsInStandoutAndShowsAnActiveBodyPlain) {
+  Options options = Scene("dialog");
+  options.term = "vt102";
+  TestConsole console(options);
+  ASSERT_TRUE(console.WaitForText("Demo Dialog"));
+  console.WaitQuiet();
+  EXPECT_TRUE(console.At(1, 2).reverse) << console.Dump();  // the dimmed owner
+  EXPECT_TRUE(console.At(20, 40).reverse);
+  EXPECT_TRUE(console.At(9, 13).reverse);    // header: dark grey
+  EXPECT_FALSE(console.At(14, 40).reverse);  // body: yellow
+  EXPECT_FALSE(console.At(15, 44).reverse);  // footer text on the body
+}
+
+TEST(ToolkitScreen, IdleDialogDimsAndTheWakingKeyRestoresIt) {
+  Options options = Scene("dialog");
+  options.timeScale = 120;  // the minute passes in half a second
+  TestConsole console(options);
+  ASSERT_TRUE(console.WaitForText("Demo Dialog"));
+  EXPECT_TRUE(HasColors(console, 9, 13, kDarkGrey, kWhite));
+  console.WaitQuiet(1500ms, 5s);
+  EXPECT_TRUE(HasColors(console, 9, 13, kBlack, kDarkGrey));
+  EXPECT_TRUE(HasColors(console, 14, 40, kBlack, kDarkGrey));
+  console.Type("x");
+  console.WaitQuiet();
+  EXPECT_TRUE(HasColors(console, 9, 13, kDarkGrey, kWhite));
+  EXPECT_TRUE(HasColors(console, 14, 40, kYellow, kWhite));
+  EXPECT_TRUE(HasColors(console, 1, 2, kBlack, kDarkGrey));  // the owner stays dimmed
+}
+
+TEST(ToolkitScreen, RootWindowShowsPanesTitlesFootersAndTheVersionLine) {
+  TestConsole console(Scene("menu"));
+  ASSERT_TRUE(console.WaitForText("Demo Menu"));
+  ASSERT_TRUE(console.WaitForLog("COLS=80, LINES=25"));
+  console.WaitQuiet();
+  EXPECT_TRUE(HasColors(console, 0, 0, kLightGrey, kWhite));   // main area box
+  EXPECT_EQ(console.At(2, 1).text, "\u2500");                  // the line on row 2
+  EXPECT_TRUE(HasColors(console, 10, 5, kYellow, kWhite));     // left pane
+  EXPECT_TRUE(HasColors(console, 10, 41, kDarkGrey, kWhite));  // right pane
+  EXPECT_TRUE(HasColors(console, 1, 3, kYellow, kBlack));      // left title
+  EXPECT_EQ(Cells(console, 1, 42, 18), "Configure Password");
+  EXPECT_TRUE(HasColors(console, 1, 42, kDarkGrey, kWhite));      // right title
+  EXPECT_TRUE(HasColors(console, 6, 42, kDarkGrey, kLightGrey));  // description
+  EXPECT_TRUE(HasColors(console, 4, 42, kDarkGrey, kWhite));      // its white word
+  // Footers: left "<Up/Down>" black and "Select" dark grey; right "<Esc>" white.
+  EXPECT_EQ(Cells(console, 22, 2, 16), "<Up/Down> Select");
+  EXPECT_TRUE(HasColors(console, 22, 2, kYellow, kBlack));
+  EXPECT_TRUE(HasColors(console, 22, 12, kYellow, kDarkGrey));
+  EXPECT_TRUE(HasColors(console, 22, 41, kDarkGrey, kWhite));
+  // The version line is centred on the status line.
+  const std::string version = "Demo Hypervisor 8.0.1 (HyKernel 8.0.1 Build 1234)";
+  EXPECT_EQ(Cells(console, 24, 40 - static_cast<int>(version.size()) / 2,
+                  static_cast<int>(version.size())),
+            version);
+  EXPECT_TRUE(HasColors(console, 24, 40, kBlack, kLightGrey));
+  // The current entry is white on black, a disabled one dark grey.
+  EXPECT_TRUE(HasColors(console, 4, 3, kBlack, kWhite));
+  EXPECT_TRUE(HasColors(console, 5, 3, kYellow, kBlack));
+  EXPECT_TRUE(HasColors(console, 7, 3, kYellow, kDarkGrey));
+}
+
+TEST(ToolkitScreen, MenuMovesOverDisabledEntriesWithFewBytesPerKey) {
+  Options options = Scene("menu");
+  options.keepOutput = true;
+  TestConsole console(options);
+  ASSERT_TRUE(console.WaitForText("Demo Menu"));
+  console.WaitQuiet();
+  std::size_t before = console.BytesReceived();
+  console.Key("Down");
+  ASSERT_TRUE(console.WaitForText("Description of Configure Lockdown"));
+  console.WaitQuiet();
+  EXPECT_LT(console.BytesReceived() - before, 600u);
+  // The next Down passes the separator and the disabled entry.
+  console.Key("Down");
+  ASSERT_TRUE(console.WaitForText("Description of View System Logs"));
+  EXPECT_TRUE(HasColors(console, 8, 3, kBlack, kWhite));
+  console.Key("Down");
+  console.WaitQuiet();
+  EXPECT_TRUE(console.Contains("Description of View System Logs"));
+  console.Key("Esc");
+  EXPECT_TRUE(console.WaitForText("result: 1"));
+}
+
+TEST(ToolkitScreen, InputFieldEditsWithTheCursorInItAndMasksThePassword) {
+  TestConsole console(Scene("input"));
+  ASSERT_TRUE(console.WaitForText("Login Name:"));
+  console.WaitQuiet();
+  // The current field: pristine, black on white, the cursor after "root".
+  // The list's first row is at screen row 13; its text area starts at
+  // column 13 and is 53 wide, so the 30-column field's value starts at 34.
+  const int fieldRow = 13;
+  const int root = 34;
+  ASSERT_EQ(Cells(console, fieldRow, 13, 11), "Login Name:") << console.Dump();
+  ASSERT_EQ(Cells(console, fieldRow, root, 4), "root") << console.Dump();
+  EXPECT_TRUE(HasColors(console, fieldRow, root, kWhite, kBlack));
+  EXPECT_TRUE(console.Cursor().visible);
+  EXPECT_EQ(console.Cursor().row, fieldRow);
+  EXPECT_EQ(console.Cursor().col, root + 4);
+
+  console.Key("End");
+  console.WaitQuiet();
+  EXPECT_TRUE(HasColors(console, fieldRow, root, kBlack, kWhite));
+  std::size_t before = console.BytesReceived();
+  console.Type("s");
+  ASSERT_TRUE(console.WaitForText("roots"));
+  console.WaitQuiet();
+  EXPECT_LT(console.BytesReceived() - before, 40u);
+  EXPECT_EQ(console.Cursor().col, root + 5);
+
+  console.Key("Down");
+  console.Type("pw");
+  ASSERT_TRUE(console.WaitForText("[ **"));
+  EXPECT_FALSE(console.Contains("pw"));
+  console.Key("Enter");
+  EXPECT_TRUE(console.WaitForText("result: 1 values: roots/pw"));
+  EXPECT_FALSE(console.Cursor().visible);
+}
+
+TEST(ToolkitScreen, CarouselStepsAndOpensTheDetailsOfItsEntry) {
+  TestConsole console(Scene("carousel"));
+  ASSERT_TRUE(console.WaitForText("Portgroup Name"));
+  ASSERT_TRUE(console.WaitForText("< Management Network"));
+  console.Key("Right");
+  ASSERT_TRUE(console.WaitForText("< VM Network"));
+  console.Type("d");
+  ASSERT_TRUE(console.WaitForText("Portgroup Details"));
+  EXPECT_TRUE(console.WaitForText("Portgroup Name: VM Network"));
+  EXPECT_TRUE(console.WaitForText("VLAN ID: 20"));
+  console.Key("Enter");
+  ASSERT_TRUE(console.WaitForTextGone("Portgroup Details"));
+  EXPECT_TRUE(console.WaitForText("< VM Network"));
+  console.Key("Enter");
+  EXPECT_TRUE(console.WaitForText("result: 1"));
+}
+
+}  // namespace
