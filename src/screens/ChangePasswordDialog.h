@@ -63,7 +63,7 @@ class ChangePasswordDialog : public Dialog {
 
   bool CheckOldPassword();
   bool Submit();
-  void ReportSuccess(const std::string& storeError);
+  void ReportSuccess();
   void ResetNewFields();
   void Select(Field field);
 

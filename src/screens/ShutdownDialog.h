@@ -2,7 +2,7 @@
 /// "Shut Down/Restart": shuts the host down (F2) or restarts it (F11),
 /// optionally terminating running virtual machines.
 ///
-/// A dialog 60 x 19 with a header of 12 rows (title 170, text 171) and one
+/// A dialog 60 x 19 with a header of 13 rows (title 170, text 171) and one
 /// check box, "Forcefully terminate running VMs, if any ..." (unticked),
 /// toggled with Space. F2 logs "Shutting down host", posts the event
 /// "qob.user.tulk.shutdown.host" and runs ShutdownConfirmDialog; F11 logs

@@ -1,0 +1,33 @@
+#include "screens/LoginDisabledDialog.h"
+
+#include "include/Keys.h"
+#include "screens/ConsoleLogin.h"
+
+namespace Tulk {
+namespace {
+
+constexpr std::uint32_t kTitle = 147;
+constexpr std::uint32_t kLead = 148;
+
+}  // namespace
+
+LoginDisabledDialog::LoginDisabledDialog(Frame* owner) : Dialog(owner, 60, 9, 6) {
+  ShowTexts();
+}
+
+void LoginDisabledDialog::ShowTexts() {
+  SetTitle(Text(kTitle));
+  SetText(LoginHostText(Text(kLead)));
+  SetFooter(kOkFooter);
+}
+
+int LoginDisabledDialog::Run() {
+  for (;;) {
+    const int key = WaitKey();
+    if (key == kKeyEnter || key == kKeyEsc) {
+      return 0;
+    }
+  }
+}
+
+}  // namespace Tulk

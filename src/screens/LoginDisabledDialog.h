@@ -1,0 +1,27 @@
+#pragma once
+/// "Authentication Denied": shown instead of the login dialog when console
+/// login is disabled (the marker "/var/run/brimlo/show-tulk-login" is
+/// absent).
+///
+/// A dialog 60 x 9 with a header of 6 rows: "Direct console access has
+/// been disabled by the administrator for <host>.<domain>." and the
+/// Enter/OK footer. It never logs anybody in: Enter closes it, and so does
+/// Esc (the operator expects Esc to go back as everywhere else); every
+/// other key is ignored. The result is always 0.
+
+#include "toolkit/Dialog.h"
+
+namespace Tulk {
+
+class LoginDisabledDialog : public Dialog {
+ public:
+  explicit LoginDisabledDialog(Frame* owner);
+
+  /// Waits for Enter (or Esc); returns 0.
+  int Run() override;
+
+ private:
+  void ShowTexts();
+};
+
+}  // namespace Tulk
