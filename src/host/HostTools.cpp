@@ -82,7 +82,7 @@ int RunOskCommand(const std::string& command) {
 int RunOskCmdGet(const std::string& path, std::string& value) {
   Log(LOG_INFO, "osk-cmd invocation: get %s", path.c_str());
   std::string output;
-  int rc = RunOskCmd({"osk-cmd", "-U", ConsoleUser(), path}, &output);
+  int rc = RunOskCmd({"osk-cmd", "-U", ConsoleUser(), "get", path}, &output);
   value = Trimmed(output);
   return rc;
 }

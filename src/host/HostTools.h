@@ -48,9 +48,9 @@ int RunOskCmd(std::vector<std::string> arguments, std::string* output = nullptr)
 int RunOskCommand(const std::string& command);
 
 /// The "get" form of the management-API tool: logs "osk-cmd invocation: get
-/// %s" with `path` at info level, runs "osk-cmd", "-U", ConsoleUser(), `path`
-/// and stores the printed value (without surrounding white space) in
-/// `value`. Returns the exit code.
+/// %s" with `path` at info level, runs "osk-cmd", "-U", ConsoleUser(),
+/// "get", `path` and stores the printed value (without surrounding white
+/// space) in `value`. Returns the exit code.
 int RunOskCmdGet(const std::string& path, std::string& value);
 
 /// True when the "get" of `path` succeeds and prints "true" (for example

@@ -1,9 +1,8 @@
 #include "HostTestRoot.h"
 
-#include <sys/stat.h>
-#include <unistd.h>
+#include <gtest/gtest.h>
+#include <stdlib.h>
 
-#include <cstdlib>
 #include <fstream>
 #include <sstream>
 
@@ -12,62 +11,8 @@ namespace {
 
 namespace fs = std::filesystem;
 
-fs::path g_root;
 fs::path g_folder;
-
-// Real programs the tests' shell lines use; the child's PATH only reaches
-// the root's bin and sbin folders.
-const char* const kPrograms[] = {"sh",   "cat", "sleep", "awk", "head", "tr",      "grep",
-                                 "true", "env", "kill",  "ls",  "wc",   "basename"};
-
-fs::path FindProgram(const std::string& name) {
-  for (const char* folder : {"/usr/bin", "/bin", "/usr/sbin", "/sbin"}) {
-    fs::path candidate = fs::path(folder) / name;
-    if (access(candidate.c_str(), X_OK) == 0) {
-      return candidate;
-    }
-  }
-  return {};
-}
-
-void WriteText(const fs::path& path, const std::string& text) {
-  fs::create_directories(path.parent_path());
-  std::ofstream(path, std::ios::binary | std::ios::trunc) << text;
-}
-
-}  // namespace
-
-void HostTestRoot::SetUp() {
-  std::string pattern = (fs::temp_directory_path() / "tulk-host-test-XXXXXX").string();
-  ASSERT_NE(mkdtemp(pattern.data()), nullptr);
-  g_folder = pattern;
-  g_root = g_folder / "root";
-  for (const char* folder : {"bin", "sbin", "etc/init.d", "var/log", "var/run"}) {
-    fs::create_directories(g_root / folder);
-  }
-  for (const char* program : kPrograms) {
-    fs::path real = FindProgram(program);
-    if (!real.empty()) {
-      fs::create_symlink(real, g_root / "bin" / program);
-    }
-  }
-  setenv("TULK_ROOT", g_root.c_str(), 1);
-  setenv("TULK_LOG_FILE", (g_folder / "log").c_str(), 1);
-  setenv("TULK_HOST_STATE", (g_folder / "host.json").c_str(), 1);
-  setenv("TULK_TEST_INVOCATIONS", (g_folder / "invocations").c_str(), 1);
-  WriteText(g_folder / "host.json", "{}");
-}
-
-void HostTestRoot::TearDown() {
-  if (std::getenv("TULK_KEEP_TEST_ROOT") == nullptr) {
-    std::error_code ignored;
-    fs::remove_all(g_folder, ignored);
-  }
-}
-
-const fs::path& Root() {
-  return g_root;
-}
+fs::path g_root;
 
 std::string ReadFile(const fs::path& path) {
   std::ifstream in(path, std::ios::binary);
@@ -76,7 +21,9 @@ std::string ReadFile(const fs::path& path) {
   return text.str();
 }
 
-namespace {
+void WriteFile(const fs::path& path, const std::string& text) {
+  std::ofstream(path, std::ios::binary | std::ios::trunc) << text;
+}
 
 std::vector<std::string> Lines(const fs::path& path) {
   std::vector<std::string> lines;
@@ -87,14 +34,43 @@ std::vector<std::string> Lines(const fs::path& path) {
   return lines;
 }
 
+class RootEnvironment : public ::testing::Environment {
+ public:
+  void SetUp() override {
+    std::string pattern = (fs::temp_directory_path() / "tulk-host-test-XXXXXX").string();
+    ASSERT_NE(mkdtemp(pattern.data()), nullptr);
+    g_folder = pattern;
+    g_root = g_folder / "root";
+    std::string install = std::string(HOST_TEST_HOSTTOOL) + " --install " + g_root.string();
+    ASSERT_EQ(std::system(install.c_str()), 0) << install;
+    setenv("TULK_ROOT", g_root.c_str(), 1);
+    setenv("TULK_LOG_FILE", (g_folder / "log").c_str(), 1);
+    setenv("TULK_HOST_STATE", (g_folder / "host.json").c_str(), 1);
+    WriteFile(g_folder / "host.json", "{}");
+  }
+  void TearDown() override {
+    if (std::getenv("TULK_KEEP_TEST_ROOT") == nullptr) {
+      std::error_code ignored;
+      fs::remove_all(g_folder, ignored);
+    }
+  }
+};
+
+[[maybe_unused]] const ::testing::Environment* const kEnvironment =
+    ::testing::AddGlobalTestEnvironment(new RootEnvironment);
+
 }  // namespace
+
+const fs::path& Root() {
+  return g_root;
+}
 
 std::vector<std::string> LogLines() {
   return Lines(g_folder / "log");
 }
 
 void ClearLog() {
-  WriteText(g_folder / "log", "");
+  WriteFile(g_folder / "log", "");
 }
 
 bool Logged(const std::string& line) {
@@ -108,36 +84,31 @@ bool Logged(const std::string& line) {
 
 void WriteScript(const std::string& hostPath, const std::string& body) {
   fs::path path = g_root / fs::path(hostPath).relative_path();
-  WriteText(path, "#!/bin/sh\n" + body + "\n");
-  fs::permissions(path, fs::perms::owner_all | fs::perms::group_read | fs::perms::group_exec);
+  WriteFile(path, "#!/bin/sh\n" + body + "\n");
+  fs::permissions(path, fs::perms::owner_all);
 }
 
-void WriteRecordingTool(const std::string& hostPath, const std::string& body,
-                        const std::string& recordVariable) {
-  std::string script = "echo \"$(basename \"$0\") $*\" >> \"$TULK_TEST_INVOCATIONS\"\n";
-  if (!recordVariable.empty()) {
-    script += "echo \"$(basename \"$0\") $" + recordVariable + "\" >> \"$TULK_TEST_INVOCATIONS\"\n";
+void WriteHostState(const nlohmann::json& state) {
+  WriteFile(g_folder / "host.json.new", state.dump());
+  fs::rename(g_folder / "host.json.new", g_folder / "host.json");
+}
+
+nlohmann::json ReadHostState() {
+  return nlohmann::json::parse(ReadFile(g_folder / "host.json"));
+}
+
+std::vector<nlohmann::json> Records(const char* file) {
+  std::vector<nlohmann::json> records;
+  for (const std::string& line : Lines(g_root / "var/log/tulk-sim" / file)) {
+    records.push_back(nlohmann::json::parse(line));
   }
-  WriteScript(hostPath, script + body);
+  return records;
 }
 
-std::vector<std::string> Invocations() {
-  return Lines(g_folder / "invocations");
-}
-
-void ClearInvocations() {
-  WriteText(g_folder / "invocations", "");
-}
-
-void WriteHostState(const std::string& json) {
-  fs::path temporary = g_folder / "host.json.new";
-  WriteText(temporary, json);
-  fs::rename(temporary, g_folder / "host.json");
+void ClearRecords() {
+  for (const char* file : {"commands.jsonl", "events.jsonl", "audit.jsonl"}) {
+    fs::remove(g_root / "var/log/tulk-sim" / file);
+  }
 }
 
 }  // namespace HostTest
-
-namespace {
-[[maybe_unused]] const ::testing::Environment* const kEnvironment =
-    ::testing::AddGlobalTestEnvironment(new HostTest::HostTestRoot);
-}  // namespace

@@ -1,15 +1,12 @@
-// The inventory's text formats: memory size, switch summary, name lists,
-// event messages. Pure functions of their input.
+// The inventory's text formats: memory size, switch summary, name lists.
+// Pure functions of their input.
 
 #include <gtest/gtest.h>
 
 #include <cstdint>
 #include <string>
-#include <vector>
 
-#include "host/EventReporter.h"
 #include "host/HardwareInventory.h"
-#include "host/NetworkInventory.h"
 #include "host/SwitchSummary.h"
 
 namespace {
@@ -54,50 +51,6 @@ TEST(SwitchSummaryTest, FormatsCountsAndNameLists) {
   EXPECT_EQ(Tulk::FormatSwitchSummary(bare),
             "Number of ports: -1\nUsed ports: 0\nConfigured ports: 0\nUplinks: None\n"
             "Port groups: None");
-}
-
-TEST(SwitchSummaryTest, JoinNamesUsesCommasWithoutBlanks) {
-  EXPECT_EQ(Tulk::JoinNames({}), "None");
-  EXPECT_EQ(Tulk::JoinNames({"a"}), "a");
-  EXPECT_EQ(Tulk::JoinNames({"a", "b c", "d"}), "a,b c,d");
-  EXPECT_EQ(Tulk::JoinNames({""}), "");
-}
-
-TEST(PnicUsageTest, MapsEachUplinkToItsSwitch) {
-  std::vector<Tulk::SwitchSummary> switches = {{"vSwitch0", {"hynic0", "hynic2"}, {}, 0, 0, 0},
-                                               {"dvs-lab", {"hynic1"}, {}, 0, 0, 0},
-                                               {"vSwitch1", {}, {}, 0, 0, 0}};
-  EXPECT_EQ(
-      Tulk::BuildPnicUsage(switches),
-      (Tulk::PnicUsage{{"hynic0", "vSwitch0"}, {"hynic1", "dvs-lab"}, {"hynic2", "vSwitch0"}}));
-}
-
-TEST(EventMessageTest, MessagesCarryMarkerIdAndText) {
-  struct Case {
-    Tulk::TulkEvent event;
-    const char* message;
-  };
-  using Tulk::TulkEvent;
-  const Case cases[] = {
-      {TulkEvent::LoginAccessDenied,
-       "@&!*@*@(qob.user.tulk.login.failed)Access denied for user %s"},
-      {TulkEvent::LoginAuthenticationFailed,
-       "@&!*@*@(qob.user.tulk.login.failed)Authentication of user %s failed"},
-      {TulkEvent::PasswordChanged,
-       "@&!*@*@(qob.user.tulk.login.passwd.changed)Login password for user %s changed"},
-      {TulkEvent::NetworkRestart, "@&!*@*@(qob.user.tulk.network.restart)Restarting %s"},
-      {TulkEvent::FactoryNetworkRestored,
-       "@&!*@*@(qob.user.tulk.factory.network.restored)Restoring factory network settings"},
-      {TulkEvent::RestartingHostAgents,
-       "@&!*@*@(qob.user.tulk.restarting.hostagents)Restarting host agents"},
-      {TulkEvent::RestoreFactoryDefaults,
-       "@&!*@*@(qob.user.tulk.restore.factory.defaults)Restoring factory defaults"},
-      {TulkEvent::RebootHost, "@&!*@*@(qob.user.tulk.reboot.host)Rebooting host"},
-      {TulkEvent::ShutdownHost, "@&!*@*@(qob.user.tulk.shutdown.host)Shutting down host"},
-  };
-  for (const Case& c : cases) {
-    EXPECT_EQ(Tulk::EventMessage(c.event), c.message);
-  }
 }
 
 }  // namespace
