@@ -1,7 +1,6 @@
 #include "render/MarkupLayout.h"
 
 #include <algorithm>
-#include <cctype>
 
 #include "render/MarkupTag.h"
 
@@ -13,6 +12,12 @@ constexpr std::size_t kNone = std::string::npos;
 constexpr long kMaxPadding = 1000000;
 
 enum class Align { kLeft, kRight, kCenter, kPadding };
+
+// What isspace() holds for in every locale the console uses: blank, tab,
+// newline, vertical tab, form feed, carriage return.
+bool IsBlank(char c) {
+  return c == ' ' || (c >= '\t' && c <= '\r');
+}
 
 long ParseLeadingDecimal(std::string_view text) {
   long value = 0;
@@ -77,7 +82,7 @@ class Layout {
     if (FieldFull()) {
       return;
     }
-    if (std::isspace(static_cast<unsigned char>(c)) != 0) {
+    if (IsBlank(c)) {
       if (room_ > 0) {
         out_ += c;
         Written();

@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <string>
+#include <vector>
 
 #include "include/ColorNumbers.h"
 #include "render/MarkupTag.h"
@@ -22,8 +23,8 @@ class Painter {
         background_(style.background) {}
 
   void Run(std::string_view text) {
-    SetWindowAttribute(window_, style_.active ? ColorAttr(style_.background, style_.foreground)
-                                              : ColorAttr(kBlack, kDarkGrey));
+    SetAttribute(style_.active ? ColorAttr(style_.background, style_.foreground)
+                               : ColorAttr(kBlack, kDarkGrey));
     std::size_t i = 0;
     while (i < text.size()) {
       char c = text[i];
@@ -53,22 +54,48 @@ class Painter {
   }
 
  private:
+  void SetAttribute(ColorAttribute attribute) {
+    SetWindowAttribute(window_, attribute);
+    int pair = attribute.pair;
+    setcchar(&cell_, L" ", attribute.attrs, static_cast<short>(pair), &pair);
+  }
+
   void Flush() {
     if (pending_.empty()) {
       return;
     }
     int length = static_cast<int>(std::min<std::size_t>(pending_.size(), 1 << 20));
     int fits = std::min(length, width_ - column_);
-    if (row_ < height_ && fits > 0 && wmove(window_, row_, column_) != ERR) {
-      waddnstr(window_, pending_.data(), fits);
+    if (row_ < height_ && fits > 0) {
+      Write(fits);
     }
     column_ += length;
     pending_.clear();
   }
 
+  // ASCII runs are copied into the window as cells, which is several times
+  // faster than adding them as a (possibly multi-byte) string; other runs go
+  // through curses' character conversion.
+  void Write(int count) {
+    bool ascii = std::all_of(pending_.begin(), pending_.begin() + count,
+                             [](char c) { return static_cast<unsigned char>(c) < 0x80; });
+    if (!ascii) {
+      if (wmove(window_, row_, column_) != ERR) {
+        waddnstr(window_, pending_.data(), count);
+      }
+      return;
+    }
+    cells_.assign(static_cast<std::size_t>(count), cell_);
+    for (int i = 0; i < count; ++i) {
+      cells_[static_cast<std::size_t>(i)].chars[0] =
+          static_cast<wchar_t>(pending_[static_cast<std::size_t>(i)]);
+    }
+    mvwadd_wchnstr(window_, row_, column_, cells_.data(), count);
+  }
+
   void Restore() {
     if (style_.active) {
-      SetWindowAttribute(window_, ColorAttr(style_.background, style_.foreground));
+      SetAttribute(ColorAttr(style_.background, style_.foreground));
     }
     foreground_ = style_.foreground;
     background_ = style_.background;
@@ -102,7 +129,7 @@ class Painter {
         backgroundInForce_ = true;
       }
       if (style_.active) {
-        SetWindowAttribute(window_, ColorAttr(background_, foreground_));
+        SetAttribute(ColorAttr(background_, foreground_));
       }
     } else if ((endColor && colorInForce_) || (endBackground && backgroundInForce_)) {
       Restore();
@@ -117,6 +144,8 @@ class Painter {
   int row_ = 0;
   int column_ = 0;
   std::string pending_;
+  cchar_t cell_{};
+  std::vector<cchar_t> cells_;
   int foreground_;
   int background_;
   bool colorInForce_ = false;

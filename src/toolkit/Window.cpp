@@ -128,7 +128,10 @@ void Window::ApplyBackground(bool active) {
 void Window::Redraw(bool active) {
   DrawBatch batch;
   g_flushPending = true;
-  if (parent_ == nullptr && !active && active_) {
+  // The cursor is handed over only when the window changes state: a window
+  // drawn active again keeps the cursor its screen has just shown.
+  const bool wasActive = active_;
+  if (parent_ == nullptr && !active && wasActive) {
     savedCursor_ = CursorState{g_cursor.visible, g_cursor.column, g_cursor.row};
     ShowCursor(false);
   }
@@ -145,7 +148,7 @@ void Window::Redraw(bool active) {
   }
   DrawDecorations();
   Update();
-  if (parent_ == nullptr && active) {
+  if (parent_ == nullptr && active && !wasActive) {
     g_cursor = ProcessCursor{savedCursor_.visible, savedCursor_.column, savedCursor_.row};
     curs_set(g_cursor.visible ? 1 : 0);
   }

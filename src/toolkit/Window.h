@@ -25,8 +25,9 @@
 ///
 /// The terminal cursor is process-wide state: MoveCursor() and
 /// ShowCursor() remember it; a top-level window saves it when it is dimmed
-/// and puts it back when it is drawn active again. A new top-level window
-/// starts with the cursor hidden.
+/// and puts it back when it is drawn active again (a window that was active
+/// already leaves the cursor as it is). The dimmed owner hides the cursor,
+/// so a frame opened above it starts with the cursor hidden.
 
 #include <curses.h>
 

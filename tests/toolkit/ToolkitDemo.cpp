@@ -8,8 +8,9 @@
 //   menu      a root window with a menu (a separator, a disabled entry)
 //   input     a dialog with a login name and a masked password field
 //   carousel  a dialog with a carousel over portgroups
-// The home frame shows "result: N" after the scene and "key: K" for every
-// key it receives; "o" opens the scene again, "q" ends the program.
+// The home frame shows "result: N" after the scene (or that the idle
+// timeout ended it) and "key: K" for every key it receives; "o" opens the
+// scene again, "q" ends the program.
 
 #include <curses.h>
 
@@ -20,6 +21,7 @@
 
 #include "include/ColorNumbers.h"
 #include "include/Keys.h"
+#include "include/ProcessFlags.h"
 #include "render/HostValues.h"
 #include "runtime/Console.h"
 #include "runtime/KeyInput.h"
@@ -180,14 +182,14 @@ class DemoHome : public Frame {
   }
 
   int Run() override {
-    RunScene();
+    RunSceneUntilTimeout();
     for (;;) {
       int key = WaitForKey(this, false);
       if (key == 'q') {
         return 0;
       }
       if (key == 'o') {
-        RunScene();
+        RunSceneUntilTimeout();
         continue;
       }
       const char* name = keyname(key);
@@ -197,6 +199,20 @@ class DemoHome : public Frame {
   }
 
  private:
+  // The idle timeout unwinds the scene back to here, as it does to the
+  // welcome screen.
+  void RunSceneUntilTimeout() {
+    try {
+      RunScene();
+    } catch (const TulkTimeout&) {
+      PutText(2, 3,
+              std::string("timed out, current window ") +
+                  (currentWindow == nullptr ? "cleared" : "set"));
+      Redraw(true);
+      currentWindow = this;
+    }
+  }
+
   void RunScene() {
     const char* scene = std::getenv("TULK_DEMO_SCENE");
     std::string name = scene != nullptr ? scene : "dialog";

@@ -133,6 +133,19 @@ TEST(ToolkitScreen, IdleDialogDimsAndTheWakingKeyRestoresIt) {
   EXPECT_TRUE(HasColors(console, 1, 2, kBlack, kDarkGrey));  // the owner stays dimmed
 }
 
+TEST(ToolkitScreen, IdleTimeoutPassesThroughTheOpenFrames) {
+  Options options = Scene("input");
+  options.timeScale = 600;  // the default ten minutes pass in one second
+  TestConsole console(options);
+  ASSERT_TRUE(console.WaitForText("Login Name:"));
+  ASSERT_TRUE(console.WaitForText("timed out, current window cleared", 5s));
+  console.WaitQuiet();
+  EXPECT_FALSE(console.Contains("Login Name:"));
+  EXPECT_FALSE(console.Cursor().visible);
+  console.Type("k");
+  EXPECT_TRUE(console.WaitForText("key: k"));
+}
+
 TEST(ToolkitScreen, RootWindowShowsPanesTitlesFootersAndTheVersionLine) {
   TestConsole console(Scene("menu"));
   ASSERT_TRUE(console.WaitForText("Demo Menu"));

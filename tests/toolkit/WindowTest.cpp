@@ -122,6 +122,9 @@ TEST_F(WindowTest, TopLevelWindowKeepsTheCursorWhileDimmed) {
   EXPECT_TRUE(Window::CursorVisible());
   EXPECT_EQ(getcury(curscr), 6 + 6 + 2);
   EXPECT_EQ(getcurx(curscr), 10 + 5);
+  // Drawn active once more, it keeps the cursor it shows.
+  dialog.Redraw(true);
+  EXPECT_TRUE(Window::CursorVisible());
   Window::ShowCursor(false);
 }
 
