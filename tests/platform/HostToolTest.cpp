@@ -48,6 +48,36 @@ TEST(HostTools, PackageQueryInKeyValueForm) {
   EXPECT_EQ(host.Run("bin/tavcli", {"software", "vib", "get", "-n", "zyo-other"}).status, 1);
 }
 
+TEST(HostTools, StandardSwitchCommands) {
+  ScratchHost host;
+  auto vswitch = [&](std::vector<std::string> args) {
+    args.insert(args.begin(), {"network", "vswitch", "standard"});
+    return host.Run("bin/tavcli", args);
+  };
+  EXPECT_EQ(vswitch({"add", "-v", "vSwitch2", "-P", "64"}).status, 0);
+  EXPECT_EQ(vswitch({"uplink", "add", "-u", "hynic3", "-v", "vSwitch2"}).status, 0);
+  EXPECT_EQ(vswitch({"portgroup", "add", "-p", "Storage", "--vswitch-name=vSwitch2"}).status, 0);
+  EXPECT_EQ(vswitch({"portgroup", "set", "-p", "Storage", "--vlan-id", "30"}).status, 0);
+  const json added = host.ReadState()["network"];
+  EXPECT_EQ(added["switches"][2]["numPorts"], 64);
+  EXPECT_EQ(added["switches"][2]["teaming"]["uplinkOrder"], json::array({"hynic3"}));
+  EXPECT_EQ(added["switches"][2]["teaming"]["maxActive"], 1);
+  EXPECT_EQ(added["portGroups"][2]["vlanId"], 30);
+
+  Finished taken = vswitch({"uplink", "add", "-u", "hynic0", "-v", "vSwitch2"});
+  EXPECT_EQ(taken.status, 1);
+  EXPECT_NE(taken.err.find("already an uplink of vSwitch0"), std::string::npos) << taken.err;
+  EXPECT_EQ(vswitch({"remove", "-v", "vSwitch2"}).status, 1) << "it has a portgroup";
+  EXPECT_EQ(vswitch({"portgroup", "remove", "-p", "Storage", "-v", "vSwitch2"}).status, 0);
+  EXPECT_EQ(vswitch({"uplink", "remove", "-u", "hynic3", "-v", "vSwitch2"}).status, 0);
+  EXPECT_EQ(vswitch({"remove", "-v", "vSwitch2"}).status, 0);
+  EXPECT_EQ(vswitch({"add"}).status, 1) << "no switch name";
+  Finished list = vswitch({"list"});
+  EXPECT_NE(list.out.find("vSwitch0\n   Num Ports: 128\n   Uplinks: hynic0, hynic1\n"),
+            std::string::npos)
+      << list.out;
+}
+
 TEST(HostTools, SshStartedThroughTheApiToolIsSeenByItsScript) {
   ScratchHost host;
   EXPECT_EQ(host.Run("etc/init.d/SSH", {"status"}).status, 3);

@@ -6,9 +6,11 @@
 #include <sys/wait.h>
 #include <unistd.h>
 
+#include <atomic>
 #include <fstream>
 #include <functional>
 #include <sstream>
+#include <thread>
 
 #include "SimTestSupport.h"
 #include "platform/api/AdvancedOption.h"
@@ -267,6 +269,41 @@ TEST(StateStore, ConcurrentChangesFromToolsAndTheConsoleAreAllKept) {
   const json state = host.ReadState();
   EXPECT_EQ(state["configBackups"], kWriters * kToolRuns);
   EXPECT_EQ(state["users"]["configStoreSaves"], kConsoleChanges);
+}
+
+TEST(StateStore, WorkerThreadsQueryWhileTheStateChanges) {
+  ScratchHost host;
+  std::atomic<bool> stop = false;
+  std::atomic<int> failures = 0;
+  std::vector<std::thread> readers;
+  for (int t = 0; t < 3; ++t) {
+    readers.emplace_back([&] {
+      while (!stop) {
+        try {
+          HykCtl::Network::DnsConfigImpl dns;
+          if (dns.GetHostname() != "tavi-01" ||
+              HykCtl::Network::NetworkInfoImpl().GetPnics().size() != 4) {
+            ++failures;
+          }
+        } catch (const HostMgrException&) {
+          ++failures;
+        }
+      }
+    });
+  }
+  HykCtl::Network::PortGroupImpl group("Management Network");
+  for (int i = 0; i < 30; ++i) {
+    group.SetVlanId(i);
+    json state = host.ReadState();
+    state["network"]["portGroups"][1]["vlanId"] = i;
+    host.WriteState(state);
+  }
+  stop = true;
+  for (std::thread& reader : readers) {
+    reader.join();
+  }
+  EXPECT_EQ(failures, 0);
+  EXPECT_EQ(group.GetVlanId(), 29);
 }
 
 }  // namespace

@@ -42,7 +42,7 @@ void PnicImpl::Refresh() {
   const Sim::json& state = Sim::Query(Op("Refresh"));
   auto snapshot = std::make_shared<Snapshot>();
   snapshot->pnic = Sim::RequirePnic(state, name_);
-  snapshot->generation = Sim::SimHost::Instance().Generation();
+  snapshot->generation = Sim::SimHost::PinnedGeneration();
   snapshot_ = std::move(snapshot);
 }
 

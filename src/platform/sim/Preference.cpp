@@ -2,7 +2,7 @@
 
 #include <cstdio>
 #include <cstdlib>
-#include <cstring>
+#include <string>
 
 #include "platform/sim/SimHost.h"
 
@@ -12,8 +12,12 @@ extern "C" {
 // root, and loads the host state before the screen starts, so that a bad
 // state file is reported on standard error with exit status 1.
 void Preference_Init() {
-  const char* root = std::getenv("TULK_ROOT");
-  if (root == nullptr || *root == '\0' || std::strcmp(root, "/") == 0) {
+  const char* value = std::getenv("TULK_ROOT");
+  std::string root = value != nullptr ? value : "";
+  while (!root.empty() && root.back() == '/') {
+    root.pop_back();
+  }
+  if (root.empty() || root == "/." || root.find_first_not_of("/.") == std::string::npos) {
     std::fprintf(stderr,
                  "tulk: the simulated host needs TULK_ROOT set to a scratch root "
                  "(scripts/make-demo-root.sh builds one)\n");

@@ -2,6 +2,7 @@
 
 #include <unistd.h>
 
+#include <atomic>
 #include <cstdlib>
 #include <string>
 
@@ -15,7 +16,7 @@
 namespace {
 
 constexpr char kMarker[] = "@&!*@*@(";
-bool g_open = false;
+std::atomic<bool> g_open = false;
 
 // A fault's message that is a number becomes the error code; anything
 // else gives 1.

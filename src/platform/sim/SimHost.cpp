@@ -89,6 +89,11 @@ class StateLock {
   int fd_ = -1;
 };
 
+// The snapshot each thread is reading; kept alive until that thread's next
+// State() call.
+thread_local std::shared_ptr<const void> t_pinned;
+thread_local std::uint64_t t_pinnedGeneration = 0;
+
 }  // namespace
 
 SimHost& SimHost::Instance() {
@@ -97,6 +102,7 @@ SimHost& SimHost::Instance() {
 }
 
 void SimHost::Load() {
+  std::lock_guard lock(mutex_);
   std::string path = Environment("TULK_HOST_STATE");
   if (path.empty()) {
     const std::string rootFile = RootStateFile();
@@ -113,10 +119,23 @@ void SimHost::Load() {
 }
 
 void SimHost::Reset() {
+  std::lock_guard lock(mutex_);
   loaded_ = false;
   path_.clear();
-  state_ = nlohmann::json();
-  ++generation_;
+  Publish(nlohmann::json());
+}
+
+void SimHost::Publish(nlohmann::json state) {
+  auto snapshot = std::make_shared<Snapshot>();
+  snapshot->state = std::move(state);
+  snapshot->generation = ++generation_;
+  snapshot_ = std::move(snapshot);
+}
+
+const SimHost::Snapshot& SimHost::Pin() {
+  t_pinned = snapshot_;
+  t_pinnedGeneration = snapshot_->generation;
+  return *snapshot_;
 }
 
 void SimHost::EnsureLoaded() {
@@ -149,9 +168,8 @@ void SimHost::ReadFile() {
   } catch (const StateError& error) {
     throw StateError(path_ + ": malformed host state: " + error.what());
   }
-  state_ = std::move(parsed);
+  Publish(std::move(parsed));
   stamp_ = stamp;
-  ++generation_;
 }
 
 bool SimHost::FileChanged() const {
@@ -163,6 +181,7 @@ bool SimHost::FileChanged() const {
 }
 
 const nlohmann::json& SimHost::State() {
+  std::lock_guard lock(mutex_);
   EnsureLoaded();
   if (FileChanged()) {
     try {
@@ -171,10 +190,11 @@ const nlohmann::json& SimHost::State() {
       // A file replaced by something malformed keeps the last good state.
     }
   }
-  return state_;
+  return Pin().state;
 }
 
 void SimHost::Modify(const std::function<void(nlohmann::json&)>& change) {
+  std::lock_guard guard(mutex_);
   EnsureLoaded();
   StateLock lock(path_);
   if (FileChanged()) {
@@ -184,20 +204,22 @@ void SimHost::Modify(const std::function<void(nlohmann::json&)>& change) {
       throw HostMgr::Lib::HostMgrException(error.what());
     }
   }
-  nlohmann::json next = state_;
+  nlohmann::json next = snapshot_->state;
   change(next);
   try {
     WriteFileAtomically(path_, next.dump(2) + "\n");
   } catch (const StateError& error) {
     throw HostMgr::Lib::HostMgrException(error.what());
   }
-  state_ = std::move(next);
+  Publish(std::move(next));
   stat(path_.c_str(), &stamp_);
-  ++generation_;
 }
 
 void SimHost::CheckFault(std::string_view operation) {
-  const nlohmann::json& state = State();
+  CheckFault(State(), operation);
+}
+
+void SimHost::CheckFault(const nlohmann::json& state, std::string_view operation) {
   auto faults = state.find("faults");
   if (faults == state.end() || faults->empty()) {
     return;
@@ -221,7 +243,11 @@ void SimHost::CheckFault(std::string_view operation) {
 
 std::uint64_t SimHost::Generation() {
   State();
-  return generation_;
+  return t_pinnedGeneration;
+}
+
+std::uint64_t SimHost::PinnedGeneration() {
+  return t_pinnedGeneration;
 }
 
 void WriteFileAtomically(const std::string& path, const std::string& text) {

@@ -22,6 +22,13 @@
 /// (device, inode, size and modification time are compared), so a query
 /// on an unchanged state costs one stat().
 ///
+/// Threads: the console's worker threads (the network test, the live core
+/// capture) run host programs and edit the hosts file while the main
+/// thread queries. Every state is an immutable snapshot; State() pins the
+/// current one for the calling thread, so a reference it returned stays
+/// valid until that thread calls State() again. Reloads and changes are
+/// serialised by a mutex.
+///
 /// Fault injection: the state's "faults" object maps an operation name to
 /// a message; that operation then throws HostMgr::Lib::HostMgrException
 /// with the message. Operations are named "Namespace::Class::Method" (such
@@ -32,6 +39,8 @@
 
 #include <cstdint>
 #include <functional>
+#include <memory>
+#include <mutex>
 #include <nlohmann/json.hpp>
 #include <stdexcept>
 #include <string>
@@ -59,7 +68,8 @@ class SimHost {
   void Reset();
 
   /// The current state, re-read first when the file was replaced. A file
-  /// replaced by a malformed one keeps the last good state.
+  /// replaced by a malformed one keeps the last good state. The reference
+  /// stays valid until the calling thread calls State() again.
   const nlohmann::json& State();
 
   /// Applies `change` as one locked read-modify-write and saves the result.
@@ -67,12 +77,17 @@ class SimHost {
   /// Failures to read or write the file throw HostMgr::Lib::HostMgrException.
   void Modify(const std::function<void(nlohmann::json&)>& change);
 
-  /// Throws HostMgr::Lib::HostMgrException when `operation` has a fault.
+  /// Throws HostMgr::Lib::HostMgrException when `operation` has a fault in
+  /// the current state.
   void CheckFault(std::string_view operation);
+  /// The same check against a state obtained from State().
+  static void CheckFault(const nlohmann::json& state, std::string_view operation);
 
   /// A number that changes whenever the state changed (re-read or
   /// modified); equal numbers mean an unchanged state.
   std::uint64_t Generation();
+  /// The generation of the state State() last returned to this thread.
+  static std::uint64_t PinnedGeneration();
 
   /// The state file's path (empty before Load).
   const std::string& Path() const { return path_; }
@@ -83,8 +98,16 @@ class SimHost {
   bool FileChanged() const;
   void EnsureLoaded();
 
+  struct Snapshot {
+    nlohmann::json state;
+    std::uint64_t generation = 0;
+  };
+  void Publish(nlohmann::json state);
+  const Snapshot& Pin();
+
+  std::recursive_mutex mutex_;
   std::string path_;
-  nlohmann::json state_;
+  std::shared_ptr<const Snapshot> snapshot_;
   bool loaded_ = false;
   std::uint64_t generation_ = 0;
   struct stat stamp_ {};

@@ -49,9 +49,9 @@ Ipv4Address Ipv4At(const json& object, const char* key) {
 }  // namespace
 
 const json& Query(std::string_view operation) {
-  SimHost& host = SimHost::Instance();
-  host.CheckFault(operation);
-  return host.State();
+  const json& state = SimHost::Instance().State();
+  SimHost::CheckFault(state, operation);
+  return state;
 }
 
 void Change(std::string_view operation, const std::function<void(json&)>& change) {
