@@ -13,8 +13,8 @@ root=${TULK_DEMO_ROOT:-$PWD/build/demo-root}
 scripts/make-demo-root.sh "$root" >/dev/null
 
 environment=(TULK_ROOT="$root")
-if [[ -f $root/host-state.json ]]; then
-  environment+=(TULK_HOST_STATE="$root/host-state.json")
+if [[ -f $root/var/lib/tulk-sim/host-state.json ]]; then
+  environment+=(TULK_HOST_STATE="$root/var/lib/tulk-sim/host-state.json")
 fi
 if [[ -x scripts/pam-env.sh ]]; then
   # Console logins go through the real PAM library, wrapped so that the
