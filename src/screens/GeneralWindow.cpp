@@ -7,6 +7,7 @@
 #include "include/Keys.h"
 #include "include/ProcessFlags.h"
 #include "runtime/KeyInput.h"
+#include "screens/ChangePasswordDialog.h"
 #include "screens/KeyboardDialog.h"
 #include "screens/LockdownDialog.h"
 #include "screens/LogPager.h"
@@ -246,6 +247,12 @@ void GeneralWindow::OpenLog(int digit) {
 
 bool GeneralWindow::OpenSelected() {
   switch (SelectedId()) {
+    case kEntryPassword: {
+      auto* dialog = new ChangePasswordDialog(this, currentUser);
+      RunFrame(dialog);
+      delete dialog;
+      return true;
+    }
     case kEntryLockdown:
       if (RunDialog<LockdownDialog>(this) != 0) {
         lockdownEnabled_ = OskCmdGetFlag(kLockdownQuery);

@@ -1,0 +1,170 @@
+// The dialogs the menu opens: lockdown mode, keyboard layout and the reset
+// of the system configuration, with their effect on the simulated host.
+
+#include <gtest/gtest.h>
+#include <signal.h>
+#include <unistd.h>
+
+#include <fstream>
+#include <thread>
+
+#include "MenuTestSupport.h"
+
+namespace {
+
+using MenuTest::DriverOptions;
+using MenuTest::SelectEntry;
+using TulkTest::DemoHostState;
+using TulkTest::TestConsole;
+using Json = nlohmann::json;
+using namespace std::chrono_literals;
+
+Json HostState(const TestConsole& console) {
+  return TulkTest::ReadHostState(console.HostStatePath());
+}
+
+bool Ran(const TestConsole& console, const std::string& line) {
+  for (const Json& record : TulkTest::SimRecords(console.Root(), "commands.jsonl")) {
+    std::string argv;
+    for (const Json& word : record["argv"]) {
+      argv += (argv.empty() ? "" : " ") + word.get<std::string>();
+    }
+    if (argv == line) {
+      return true;
+    }
+  }
+  return false;
+}
+
+long CpuTicks(pid_t pid) {
+  std::ifstream stat("/proc/" + std::to_string(pid) + "/stat");
+  std::string text((std::istreambuf_iterator<char>(stat)), std::istreambuf_iterator<char>());
+  std::istringstream fields(text.substr(text.rfind(')') + 2));
+  std::string field;
+  long ticks = 0;
+  for (int i = 3; i <= 15 && fields >> field; ++i) {
+    if (i >= 14) {
+      ticks += std::stol(field);
+    }
+  }
+  return ticks;
+}
+
+TEST(MenuDialogScreenTest, LockdownToggleRoundTrip) {
+  TestConsole console(DriverOptions());
+  ASSERT_TRUE(SelectEntry(console, "Configure Lockdown Mode"));
+  EXPECT_TRUE(console.WaitForText("Disabled"));
+  struct Step {
+    bool toggle;
+    const char* key;
+    const char* before;
+    bool expected;
+    const char* shown;
+  };
+  const Step steps[] = {
+      {true, "Enter", "[ ] Enable lockdown mode", true, "Enabled"},
+      {true, "Esc", "[X] Enable lockdown mode", true, "Enabled"},
+      {true, "Enter", "[X] Enable lockdown mode", false, "Disabled"},
+  };
+  for (const Step& step : steps) {
+    console.Key("Enter");
+    ASSERT_TRUE(MenuTest::Shown(console, step.before));
+    EXPECT_TRUE(console.WaitForText("When enabled, lockdown mode prevents users"));
+    console.Key("Space");
+    console.Key(step.key);
+    ASSERT_TRUE(MenuTest::Gone(console, "Enable lockdown mode"));
+    EXPECT_EQ(HostState(console)["lockdown"]["enabled"], step.expected);
+    EXPECT_TRUE(console.WaitForText(step.shown));
+  }
+  EXPECT_TRUE(
+      console.WaitForLog("Command \"osk-cmd -U root osksvc/auth/lockdown_exit\" succeeded"));
+}
+
+TEST(MenuDialogScreenTest, KeyboardLayoutChangeReachesTheHost) {
+  TulkTest::Options options = DriverOptions();
+  options.term = "xterm";
+  TestConsole console(options);
+  ASSERT_TRUE(SelectEntry(console, "Configure Keyboard"));
+  console.Key("Enter");
+  ASSERT_TRUE(MenuTest::Shown(console, "(o) US Default"));
+  EXPECT_TRUE(console.WaitForText("If you are having difficulty using your keyboard"));
+  console.Key("Up");
+  console.Key("Esc");
+  ASSERT_TRUE(MenuTest::Gone(console, "(o) US Default"));
+  EXPECT_EQ(HostState(console)["system"]["keyboardLayout"], "US Default");
+
+  console.Key("Enter");
+  ASSERT_TRUE(MenuTest::Shown(console, "(o) US Default"));
+  console.Key("Down");
+  console.Key("Enter");
+  ASSERT_TRUE(MenuTest::Gone(console, "If you are having difficulty"));
+  EXPECT_TRUE(console.WaitForLog("<14>Keyboard layout changed to US Dvorak"));
+  EXPECT_EQ(HostState(console)["system"]["keyboardLayout"], "US Dvorak");
+  console.Key("Enter");
+  EXPECT_TRUE(console.WaitForText("(o) US Dvorak"));
+}
+
+TEST(MenuDialogScreenTest, FailedResetIsReportedAfterTheEventAndLogLine) {
+  Json host = DemoHostState();
+  host["commands"]["firmwareConfig.py --reset-only"] = {{"exitCode", 1}, {"delayMs", 800}};
+  TestConsole console(DriverOptions(host));
+  ASSERT_TRUE(SelectEntry(console, "Reset System Configuration"));
+  console.Key("Enter");
+  ASSERT_TRUE(MenuTest::Shown(console, "Reset System Configuration now?"));
+  EXPECT_TRUE(console.WaitForText("Reset System Configuration: Confirm"));
+  console.Key("Enter");
+  console.WaitQuiet(300ms);
+  EXPECT_TRUE(console.WaitForText("Reset System Configuration now?"));
+  EXPECT_FALSE(console.WaitForLog("Restoring factory defaults", 100ms));
+
+  console.Key("F11");
+  ASSERT_TRUE(MenuTest::Shown(console, "Please wait while the default settings are restored."));
+  ASSERT_TRUE(MenuTest::WaitUntil(
+      console, [&] { return Ran(console, "firmwareConfig.py --reset-only"); }, "the reset"));
+  const auto events = TulkTest::SimRecords(console.Root(), "events.jsonl");
+  ASSERT_EQ(events.size(), 1U);
+  EXPECT_EQ(events[0]["id"], "qob.user.tulk.restore.factory.defaults");
+  EXPECT_EQ(events[0]["text"], "Restoring factory defaults");
+  EXPECT_TRUE(console.WaitForLog("<14>Restoring factory defaults", 0ms));
+
+  ASSERT_TRUE(MenuTest::Shown(console, "Failed to reset system configuration."));
+  EXPECT_TRUE(console.WaitForText("Reset System Configuration: Error"));
+  EXPECT_FALSE(Ran(console, "reboot -f"));
+  console.Key("Enter");
+  EXPECT_TRUE(console.WaitForTextGone("Failed to reset"));
+}
+
+TEST(MenuDialogScreenTest, SuccessfulResetRestartsOnEnterAndWaitsWithoutCpu) {
+  Json host = DemoHostState();
+  host["lockdown"]["enabled"] = true;
+  TestConsole console(DriverOptions(host, "restore"));
+  ASSERT_TRUE(MenuTest::Shown(console, "Reset System Configuration now?"));
+  console.Key("F11");
+  ASSERT_TRUE(MenuTest::Shown(console, "Default settings are restored."));
+  EXPECT_TRUE(console.WaitForText("<Enter> Restart Host"));
+  EXPECT_EQ(HostState(console)["lockdown"]["enabled"], false);
+  console.Key("Esc");
+  console.Key("F11");
+  console.WaitQuiet(300ms);
+  EXPECT_FALSE(Ran(console, "reboot -f"));
+  EXPECT_TRUE(console.WaitForText("Default settings are restored."));
+
+  console.Key("Enter");
+  ASSERT_TRUE(MenuTest::WaitUntil(
+      console, [&] { return Ran(console, "reboot -f"); }, "the restart"));
+  EXPECT_EQ(HostState(console)["power"], "rebooting");
+  EXPECT_EQ(HostState(console)["powerForced"], true);
+  console.WaitQuiet(200ms);
+  const long before = CpuTicks(console.Pid());
+  console.Key("Esc");
+  console.Key("Enter");
+  std::this_thread::sleep_for(500ms);
+  EXPECT_LE(CpuTicks(console.Pid()) - before, 2);
+  EXPECT_TRUE(console.Running());
+  EXPECT_FALSE(console.Contains("result:"));
+
+  console.Signal(SIGTERM);
+  EXPECT_EQ(console.WaitExit(), 0);
+}
+
+}  // namespace

@@ -1,0 +1,235 @@
+// The System Customization menu through the driver: entries and their
+// greying, descriptions, support pages with host fingerprints, and the
+// screens of other folders opened through the registry.
+
+#include <gtest/gtest.h>
+
+#include <filesystem>
+#include <fstream>
+
+#include "MenuTestSupport.h"
+
+namespace {
+
+using MenuTest::DriverOptions;
+using MenuTest::RightTitle;
+using MenuTest::SelectEntry;
+using TulkTest::DemoHostState;
+using TulkTest::TestConsole;
+using Json = nlohmann::json;
+
+constexpr int kDarkGrey = 6;
+constexpr int kMenuTop = 4;  // screen row of the first entry
+
+int RowOf(const TestConsole& console, const std::string& label) {
+  for (int row = kMenuTop; row < 24; ++row) {
+    if (console.Row(row).substr(0, 40).find(label) != std::string::npos) {
+      return row;
+    }
+  }
+  return -1;
+}
+
+TEST(MenuScreenTest, HostStateGreysEntriesAndSelectionSkipsThem) {
+  struct Case {
+    const char* name;
+    std::function<void(Json&)> change;
+    std::vector<std::string> greyed;
+    int downs;
+    const char* selected;
+  };
+  const Case cases[] = {
+      {"no management NIC",
+       [](Json& h) { h["network"].erase("managementInterface"); },
+       {"Configure Management Network", "Restart Management Network", "Test Management Network"},
+       2,
+       "Network Restore Options"},
+      {"management NIC down",
+       [](Json& h) { h["network"]["hykernelNics"][0]["enabled"] = false; },
+       {"Configure Management Network", "Test Management Network"},
+       2,
+       "Network Restore Options"},
+      {"lockdown impossible",
+       [](Json& h) {
+         h["lockdown"] = {{"enabled", false}, {"possible", false}};
+       },
+       {"Configure Lockdown Mode"},
+       1,
+       "Configure Management Network"},
+      {"network boot",
+       [](Json& h) { h["advancedOptions"]["PXEBootEnabled"] = 1; },
+       {"Reset System Configuration"},
+       20,
+       "View Support Information"},
+  };
+  for (const Case& c : cases) {
+    SCOPED_TRACE(c.name);
+    Json host = DemoHostState();
+    c.change(host);
+    TestConsole console(DriverOptions(host));
+    ASSERT_TRUE(MenuTest::Shown(console, "System Customization"));
+    for (const std::string& label : c.greyed) {
+      const int row = RowOf(console, label);
+      ASSERT_GE(row, 0) << label << "\n" << console.Dump();
+      EXPECT_EQ(console.At(row, 3).fg, kDarkGrey) << label << "\n" << console.Dump();
+    }
+    EXPECT_NE(console.At(RowOf(console, "Network Restore Options"), 3).fg, kDarkGrey);
+    console.Key("Down", c.downs);
+    console.WaitQuiet();
+    EXPECT_EQ(RightTitle(console), c.selected) << console.Dump();
+  }
+}
+
+TEST(MenuScreenTest, KeyboardEntryOnlyOnLocalConsole) {
+  TulkTest::Options remote = DriverOptions();
+  TestConsole console(remote);
+  ASSERT_TRUE(MenuTest::Shown(console, "System Customization"));
+  EXPECT_EQ(RowOf(console, "Configure Keyboard"), -1);
+  EXPECT_EQ(RowOf(console, "Troubleshooting Options"), kMenuTop + 8);
+
+  TulkTest::Options local = DriverOptions();
+  local.term = "xterm";
+  TestConsole localConsole(local);
+  ASSERT_TRUE(MenuTest::Shown(localConsole, "System Customization"));
+  EXPECT_EQ(RowOf(localConsole, "Configure Keyboard"), kMenuTop + 8);
+  EXPECT_EQ(RowOf(localConsole, "Troubleshooting Options"), kMenuTop + 9);
+}
+
+TEST(MenuScreenTest, EveryEntryDescribesItselfWithItsFooter) {
+  Json host = DemoHostState();
+  host["network"]["hykernelNics"][0]["ipv4"] = {{"mode", "dhcp"}};
+  TulkTest::Options options = DriverOptions(host);
+  options.term = "xterm";
+  options.env["TULK_MENU_EMPTY_PASSWORD"] = "1";
+  TestConsole console(options);
+  ASSERT_TRUE(MenuTest::Shown(console, "System Customization"));
+  struct Entry {
+    const char* title;
+    const char* text;
+    const char* footer;
+  };
+  const Entry entries[] = {
+      {"Configure Password", "Not set", "<Enter> Change"},
+      {"Configure Lockdown Mode", "Disabled", "<Enter> Change"},
+      {"Configure Management Network", "Network identity acquired from", "<Enter> More"},
+      {"Restart Management Network", "Restarting the management", "<Enter> Restart"},
+      {"Test Management Network", "To perform a brief network", "<Enter> Run Test"},
+      {"Network Restore Options", "To view various network restore", "<Enter> More"},
+      {"Configure Keyboard", "To select the layout type", "<Enter> More"},
+      {"Troubleshooting Options", "To view various troubleshooting", "<Enter> More"},
+      {"View System Logs", "Press the corresponding key", "<Esc> Log Out"},
+      {"View Support Information", "", "<Page Up> <Page Down>"},
+      {"Reset System Configuration", "Warning!", "<Enter> Reset"},
+  };
+  for (const Entry& entry : entries) {
+    ASSERT_TRUE(SelectEntry(console, entry.title));
+    EXPECT_TRUE(console.WaitForText(entry.text)) << entry.title;
+    EXPECT_NE(console.Row(22).find(entry.footer), std::string::npos) << entry.title << "\n"
+                                                                     << console.Dump();
+    EXPECT_NE(console.Row(22).find("<Esc> Log Out"), std::string::npos) << entry.title;
+  }
+  console.Key("Esc");
+  EXPECT_TRUE(console.WaitForText("result: 1"));
+}
+
+TEST(MenuScreenTest, NetworkEntryShowsTheManagementSettings) {
+  TestConsole console(DriverOptions());
+  ASSERT_TRUE(SelectEntry(console, "Configure Management Network"));
+  for (const char* text : {"Hostname:", "tavi-01", "IPv4 Address:", "10.20.30.41",
+                           "IPv6 Addresses:", "2001:db8:20:30::41/64"}) {
+    EXPECT_TRUE(console.WaitForText(text)) << text;
+  }
+  EXPECT_FALSE(console.Contains("Network identity acquired"));
+}
+
+TEST(MenuScreenTest, SupportPagesTurnWithinTheirLimits) {
+  TulkTest::Options options = DriverOptions();
+  options.prepareRoot = [](const std::filesystem::path& root) {
+    TulkTest::WriteRootFile(root, "/etc/brimlo/support",
+                            "# not shown\nPage one of {hostname}\n$\nPage two\n$\nPage three\n");
+  };
+  TestConsole console(options);
+  ASSERT_TRUE(SelectEntry(console, "View Support Information"));
+  EXPECT_TRUE(console.WaitForText("Page one of tavi-01.lab.example.net"));
+  EXPECT_FALSE(console.Contains("not shown"));
+  console.Key("PageUp");
+  console.WaitQuiet();
+  EXPECT_TRUE(console.WaitForText("Page one"));
+  console.Key("PageDown", 2);
+  EXPECT_TRUE(console.WaitForText("Page three"));
+  console.Key("PageDown");
+  console.WaitQuiet();
+  EXPECT_TRUE(console.WaitForText("Page three"));
+  console.Key("Up");
+  console.Key("Down");
+  EXPECT_TRUE(console.WaitForText("Page one"));
+}
+
+TEST(MenuScreenTest, SupportPageShowsHostFingerprints) {
+  TulkTest::Options options = DriverOptions();
+  options.cols = 220;
+  options.prepareRoot = [](const std::filesystem::path& root) {
+    const std::string ssl = (root / "etc/brimlo/ssl").string();
+    const std::string ssh = (root / "etc/ssh").string();
+    MenuTest::Capture("openssl req -x509 -newkey rsa:2048 -nodes -subj /CN=tavi -days 2 -keyout " +
+                      ssl + "/host.key -out " + ssl + "/host.crt 2>/dev/null");
+    MenuTest::Capture("ssh-keygen -q -t ed25519 -N '' -f " + ssh + "/ssh_host_rsa_key");
+    TulkTest::WriteRootFile(root, "/etc/brimlo/support",
+                            "sha256=[{ssl-thumbprint-sha-256}]\nrsa=[{ssh-rsa-fingerprint}]\n"
+                            "dsa=[{ssh-dsa-fingerprint}]\n");
+  };
+  TestConsole console(options);
+  const std::string thumbprint = MenuTest::Capture(
+      "openssl x509 -noout -fingerprint -sha256 -in " +
+      (console.Root() / "etc/brimlo/ssl/host.crt").string() + " | cut -d= -f2 | tr -d '\\n'");
+  const std::string fingerprint = MenuTest::Capture(
+      "ssh-keygen -l -f " + (console.Root() / "etc/ssh/ssh_host_rsa_key").string() +
+      " | cut -d' ' -f2 | tr -d '\\n'");
+  ASSERT_EQ(thumbprint.size(), 95U);
+  ASSERT_TRUE(SelectEntry(console, "View Support Information", 220));
+  EXPECT_TRUE(console.WaitForText("sha256=[" + thumbprint + "]"));
+  EXPECT_TRUE(console.WaitForText("rsa=[" + fingerprint + "]"));
+  EXPECT_TRUE(console.WaitForText("dsa=[]"));
+  EXPECT_TRUE(console.WaitForLog("<11>SSH Key Fingerprint generation failed: "));
+}
+
+TEST(MenuScreenTest, UnreadableCertificateLeavesTheThumbprintEmpty) {
+  TulkTest::Options options = DriverOptions();
+  options.prepareRoot = [](const std::filesystem::path& root) {
+    TulkTest::WriteRootFile(root, "/etc/brimlo/ssl/host.crt", "not a certificate\n");
+    TulkTest::WriteRootFile(root, "/etc/brimlo/support", "sha256=[{ssl-thumbprint-sha-256}]\n");
+  };
+  TestConsole console(options);
+  ASSERT_TRUE(SelectEntry(console, "View Support Information"));
+  EXPECT_TRUE(console.WaitForText("sha256=[]"));
+  EXPECT_TRUE(console.WaitForLog("<11>Failed to generate the host's SHA256 SSL thumbprint"));
+}
+
+TEST(MenuScreenTest, RegisteredScreensOpenAndAVanishedInterfaceIsReported) {
+  TulkTest::Options options = DriverOptions();
+  options.env["TULK_MENU_OPENERS"] = "1";
+  TestConsole console(options);
+  ASSERT_TRUE(SelectEntry(console, "Configure Management Network"));
+  console.Key("Enter");
+  ASSERT_TRUE(MenuTest::Shown(console, "Opened ManagementNetwork"));
+  console.Key("Enter");
+  ASSERT_TRUE(MenuTest::Gone(console, "Opened ManagementNetwork"));
+
+  Json host = TulkTest::ReadHostState(console.HostStatePath());
+  host["network"].erase("managementInterface");
+  const auto fresh = console.HostStatePath().string() + ".new";
+  std::ofstream(fresh) << host.dump();
+  std::filesystem::rename(fresh, console.HostStatePath());
+
+  ASSERT_TRUE(SelectEntry(console, "Restart Management Network"));
+  console.Key("Enter");
+  EXPECT_TRUE(console.WaitForText("Management network interface cannot be found."));
+  EXPECT_TRUE(console.WaitForText("Restart Management Network: Error"));
+  console.Key("Esc");
+  console.WaitQuiet();
+  EXPECT_TRUE(console.WaitForText("Management network interface cannot be found."));
+  console.Key("Enter");
+  EXPECT_TRUE(console.WaitForTextGone("cannot be found"));
+}
+
+}  // namespace

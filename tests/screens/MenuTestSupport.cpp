@@ -1,0 +1,92 @@
+#include "MenuTestSupport.h"
+
+#include <cstdio>
+#include <fstream>
+#include <sstream>
+#include <thread>
+
+namespace MenuTest {
+
+TulkTest::Options DriverOptions(const nlohmann::json& host, const std::string& scene) {
+  TulkTest::Options options;
+  options.program = TULK_TEST_MENU_DRIVER;
+  options.hostState = host.dump();
+  options.env["TULK_MENU_SCENE"] = scene;
+  return options;
+}
+
+::testing::AssertionResult WaitUntil(TulkTest::TestConsole& console,
+                                     const std::function<bool()>& condition,
+                                     const std::string& what, std::chrono::milliseconds timeout) {
+  const auto deadline = std::chrono::steady_clock::now() + timeout;
+  while (!condition()) {
+    if (std::chrono::steady_clock::now() > deadline) {
+      return ::testing::AssertionFailure() << "timed out waiting for " << what << "\n"
+                                           << console.Dump();
+    }
+    console.Pump(std::chrono::milliseconds(20));
+  }
+  return ::testing::AssertionSuccess();
+}
+
+::testing::AssertionResult Shown(TulkTest::TestConsole& console, const std::string& text) {
+  ::testing::AssertionResult shown = console.WaitForText(text);
+  console.WaitQuiet();
+  return shown;
+}
+
+::testing::AssertionResult Gone(TulkTest::TestConsole& console, const std::string& text) {
+  ::testing::AssertionResult gone = console.WaitForTextGone(text);
+  console.WaitQuiet();
+  return gone;
+}
+
+std::string RightTitle(const TulkTest::TestConsole& console, int cols) {
+  std::string text;
+  for (int col = cols / 2 + 2; col < cols - 1; ++col) {
+    text += console.At(1, col).text;
+  }
+  return text.substr(0, text.find_last_not_of(' ') + 1);
+}
+
+::testing::AssertionResult SelectEntry(TulkTest::TestConsole& console, const std::string& title,
+                                       int cols) {
+  console.WaitForText("System Customization");
+  for (int step = 0; step < 20; ++step) {
+    const std::string shown = RightTitle(console, cols);
+    if (shown == title) {
+      console.WaitQuiet();
+      return ::testing::AssertionSuccess();
+    }
+    console.Key("Down");
+    if (!WaitUntil(
+            console, [&] { return RightTitle(console, cols) != shown; }, "a move",
+            std::chrono::milliseconds(2000))) {
+      break;
+    }
+  }
+  return ::testing::AssertionFailure() << "no entry " << title << "\n" << console.Dump();
+}
+
+std::string ReadText(const std::filesystem::path& path) {
+  std::ifstream in(path);
+  std::stringstream text;
+  text << in.rdbuf();
+  return text.str();
+}
+
+std::string Capture(const std::string& commandLine) {
+  std::string output;
+  FILE* pipe = popen(commandLine.c_str(), "r");
+  if (pipe == nullptr) {
+    return output;
+  }
+  char buffer[256];
+  while (std::fgets(buffer, sizeof buffer, pipe) != nullptr) {
+    output += buffer;
+  }
+  pclose(pipe);
+  return output;
+}
+
+}  // namespace MenuTest

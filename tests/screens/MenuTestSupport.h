@@ -1,0 +1,47 @@
+#pragma once
+// Helpers of the menu's screen tests: the driver program (MenuDriver.cpp)
+// on a chosen host, and waits on files the console or the simulated host
+// write.
+
+#include <chrono>
+#include <filesystem>
+#include <functional>
+#include <string>
+
+#include <nlohmann/json.hpp>
+
+#include "ScreenTestSupport.h"
+#include "TestConsole.h"
+
+namespace MenuTest {
+
+/// Options that run the menu driver with `scene` on `host`.
+TulkTest::Options DriverOptions(const nlohmann::json& host = TulkTest::DemoHostState(),
+                                const std::string& scene = "menu");
+
+/// Waits until `condition` holds, pumping the console's output meanwhile.
+::testing::AssertionResult WaitUntil(TulkTest::TestConsole& console,
+                                     const std::function<bool()>& condition,
+                                     const std::string& what,
+                                     std::chrono::milliseconds timeout = std::chrono::seconds(5));
+
+/// Waits for `text` to appear (or, for Gone, to disappear), then until the
+/// console is quiet: a frame discards the keys typed while it is drawn, so
+/// tests wait for the drawing to end before they type.
+::testing::AssertionResult Shown(TulkTest::TestConsole& console, const std::string& text);
+::testing::AssertionResult Gone(TulkTest::TestConsole& console, const std::string& text);
+
+/// The right pane's title (row 1, from the middle of the screen), trimmed.
+std::string RightTitle(const TulkTest::TestConsole& console, int cols = 80);
+
+/// Moves the selection down until the right title is `title`.
+::testing::AssertionResult SelectEntry(TulkTest::TestConsole& console, const std::string& title,
+                                       int cols = 80);
+
+/// The whole text of a file (empty when missing).
+std::string ReadText(const std::filesystem::path& path);
+
+/// Runs a shell command line and returns its standard output.
+std::string Capture(const std::string& commandLine);
+
+}  // namespace MenuTest
