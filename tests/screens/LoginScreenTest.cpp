@@ -1,0 +1,219 @@
+// The login on the real binary through the real PAM library (pam_wrapper
+// with pam_matrix and the test policy module): modes, outcomes and their
+// log lines, audit records and events.
+
+#include <signal.h>
+
+#include <fstream>
+
+#include "SessionTestSupport.h"
+
+namespace {
+
+using nlohmann::json;
+using SessionTest::ConsoleOptions;
+using SessionTest::Gone;
+using SessionTest::LogIn;
+using SessionTest::RecordsWhere;
+using SessionTest::RowOf;
+using SessionTest::Settled;
+using SessionTest::WaitUntil;
+using TulkTest::DemoHostState;
+using TulkTest::TestConsole;
+
+std::string ReadFile(const std::filesystem::path& path) {
+  std::ifstream in(path);
+  return std::string(std::istreambuf_iterator<char>(in), {});
+}
+
+TEST(LoginScreenTest, NamePasswordModeAndEscLeavesNoTrace) {
+  TestConsole console(ConsoleOptions());
+  ASSERT_TRUE(Settled(console, "To manage this host"));
+  const std::size_t logBefore = console.LogLines().size();
+  console.Key("F2");
+  ASSERT_TRUE(Settled(console, "Authentication Required"));
+  console.WaitQuiet();
+  EXPECT_TRUE(console.Contains("Enter an authorized login name and password for"));
+  EXPECT_TRUE(console.Contains("tavi-01.lab.example.net."));
+  EXPECT_TRUE(console.Contains("Login Name:        [ root "));
+  EXPECT_TRUE(console.Contains("Password:          [      "));
+  EXPECT_TRUE(console.Contains("<Enter> OK  <Esc> Cancel"));
+  EXPECT_FALSE(console.Contains("Configured Keyboard"));
+  EXPECT_EQ(console.Cursor().row, RowOf(console, "Login Name:"));
+  EXPECT_TRUE(console.Cursor().visible);
+
+  console.Type("x");
+  console.Key("Esc");
+  ASSERT_TRUE(Gone(console, "Authentication Required"));
+  console.WaitQuiet();
+  EXPECT_EQ(console.LogLines().size(), logBefore);
+  EXPECT_TRUE(RecordsWhere(console, "audit.jsonl", "event", "tulk.login").empty());
+  EXPECT_FALSE(console.Cursor().visible);
+}
+
+TEST(LoginScreenTest, F3SwitchesBetweenPasswordAndPinMode) {
+  TestConsole console(ConsoleOptions());
+  ASSERT_TRUE(Settled(console, "Customize System/View Logs"));
+  console.Key("F2");
+  ASSERT_TRUE(Settled(console, "Login Name:"));
+  console.Key("Down");
+  console.Type("abc");
+  console.Key("F3");
+  ASSERT_TRUE(Settled(console, "Enter the smart card login PIN for"));
+  EXPECT_TRUE(console.Contains("Login Id:          [       "));
+  EXPECT_TRUE(console.Contains("PIN:               [       "));
+  EXPECT_TRUE(console.Contains("<F3> Switch PIN/Password Login"));
+  EXPECT_FALSE(console.Contains("***"));
+  console.Key("F3");
+  ASSERT_TRUE(Settled(console, "Login Name:        [ root "));
+  EXPECT_TRUE(console.Contains("Enter an authorized login name and password for"));
+}
+
+TEST(LoginScreenTest, WrongPasswordIsReportedAndCanBeRetried) {
+  TestConsole console(ConsoleOptions());
+  ASSERT_TRUE(LogIn(console, "root", "wrong"));
+  ASSERT_TRUE(Settled(console, "Invalid login or password."));
+  EXPECT_TRUE(console.Contains("Authentication failed"));
+  ASSERT_TRUE(console.WaitForLog("Authentication of user root failed"));
+  EXPECT_EQ(SessionTest::CountLog(console, "<35>Authentication of user root failed"), 1);
+
+  const auto audit = RecordsWhere(console, "audit.jsonl", "event", "tulk.login");
+  ASSERT_EQ(audit.size(), 1u);
+  EXPECT_EQ(audit[0]["result"], "failure");
+  EXPECT_EQ(audit[0]["user"], "root");
+  EXPECT_EQ(audit[0]["attributes"], json({{"reason", "Invalid login"}}));
+  const auto events = RecordsWhere(console, "events.jsonl", "id", "qob.user.tulk.login.failed");
+  ASSERT_EQ(events.size(), 1u);
+  EXPECT_EQ(events[0]["text"], "Authentication of user root failed");
+
+  console.Key("Esc");  // only Enter closes the message
+  console.WaitQuiet();
+  EXPECT_TRUE(console.Contains("Invalid login or password."));
+  console.Key("Enter");
+  ASSERT_TRUE(Gone(console, "Invalid login or password."));
+  EXPECT_TRUE(console.Contains("Login Name:        [ root "));
+  EXPECT_FALSE(console.Contains("*****"));
+  console.Type(SessionTest::kRootPassword);
+  console.Key("Enter");
+  ASSERT_TRUE(Settled(console, "System Customization"));
+  EXPECT_EQ(SessionTest::CountLog(console, "<32>Authentication of user root succeeded"), 1);
+  EXPECT_EQ(SessionTest::CountLog(console, "<14>User root logged in"), 1);
+  const auto logins = RecordsWhere(console, "audit.jsonl", "event", "tulk.login");
+  ASSERT_EQ(logins.size(), 2u);
+  EXPECT_EQ(logins[1]["result"], "success");
+  EXPECT_EQ(logins[1]["attributes"], json::object());
+}
+
+TEST(LoginScreenTest, PermissionDeniedByTheAccountCheck) {
+  TulkTest::Options options = ConsoleOptions();
+  options.pamPolicy = {"operator:denied"};
+  TestConsole console(options);
+  ASSERT_TRUE(LogIn(console, "operator", "operator"));
+  ASSERT_TRUE(Settled(console, "User does not have permission to login to TULK."));
+  EXPECT_EQ(SessionTest::CountLog(console, "<35>Access denied for user operator"), 1);
+  const auto audit = RecordsWhere(console, "audit.jsonl", "event", "tulk.login");
+  ASSERT_EQ(audit.size(), 1u);
+  EXPECT_EQ(audit[0]["attributes"], json({{"reason", "No permission"}}));
+  const auto events = RecordsWhere(console, "events.jsonl", "id", "qob.user.tulk.login.failed");
+  ASSERT_EQ(events.size(), 1u);
+  EXPECT_EQ(events[0]["text"], "Access denied for user operator");
+  console.Key("Enter");
+  ASSERT_TRUE(Settled(console, "Login Name:        [ operator "));
+}
+
+TEST(LoginScreenTest, ExpiredPasswordIsChangedThenLoginAgain) {
+  TulkTest::Options options = ConsoleOptions();
+  options.pamPolicy = {"root:expired"};
+  TestConsole console(options);
+  ASSERT_TRUE(LogIn(console));
+  ASSERT_TRUE(Settled(console, "Password has expired."));
+  EXPECT_TRUE(console.Contains("You will be prompted to set a new password and then"));
+  EXPECT_EQ(SessionTest::CountLog(console, "<35>Password has expired for user root"), 1);
+  const auto audit = RecordsWhere(console, "audit.jsonl", "event", "tulk.login");
+  ASSERT_EQ(audit.size(), 1u);
+  EXPECT_EQ(audit[0]["attributes"], json({{"reason", "Password expired"}}));
+  EXPECT_EQ(RecordsWhere(console, "events.jsonl", "text", "Access denied for user root").size(),
+            1u);
+
+  console.Key("Enter");
+  ASSERT_TRUE(Settled(console, "Setting the password will prevent unauthorized access"));
+  console.Type(SessionTest::kRootPassword);
+  console.Key("Down");
+  ASSERT_TRUE(WaitUntil(
+      console, [&] { return console.Cursor().row == RowOf(console, "New Password:"); },
+      "the new-password field"));
+  console.Type("fresh-1");
+  console.Key("Down");
+  console.Type("fresh-1");
+  console.Key("Enter");
+  ASSERT_TRUE(Gone(console, "Confirm Password:"));
+  ASSERT_TRUE(Settled(console, "Authentication Required"));
+  EXPECT_FALSE(console.Contains("System Customization"));
+  EXPECT_NE(ReadFile(console.PamPasswordFile()).find("root:fresh-1:"), std::string::npos);
+
+  console.Type("fresh-1");
+  console.Key("Enter");
+  ASSERT_TRUE(Settled(console, "System Customization"));
+  EXPECT_TRUE(console.Contains("Set"));
+}
+
+TEST(LoginScreenTest, EmptyPasswordMarksThePasswordNotSet) {
+  TulkTest::Options options = ConsoleOptions();
+  options.pamUsers = {{"root", ""}};
+  TestConsole console(options);
+  ASSERT_TRUE(LogIn(console, "root", ""));
+  ASSERT_TRUE(Settled(console, "System Customization"));
+  EXPECT_TRUE(console.WaitForText("Not set"));
+}
+
+TEST(LoginScreenTest, SmartCardLoginAndRemoval) {
+  json host = DemoHostState();
+  host["smartCards"] = json::array({{{"userId", "cardholder"}, {"valid", true}}});
+  TulkTest::Options options = ConsoleOptions(host);
+  options.pamUsers["cardholder"] = "2468";
+  TestConsole console(options);
+  ASSERT_TRUE(Settled(console, "Customize System/View Logs"));
+  console.Key("F2");
+  ASSERT_TRUE(Settled(console, "Enter the smart card login PIN for"));
+  EXPECT_TRUE(console.Contains("Login Id:          [ cardholder "));
+  EXPECT_EQ(SessionTest::CountLog(console, "<14>Found smart card with user id 'cardholder'"), 1);
+  console.Key("Down");
+  console.Type("2468");
+  console.Key("Enter");
+  ASSERT_TRUE(Settled(console, "System Customization"));
+  // The check runs on SIGUSR1 whichever frame has the keys; here the
+  // password dialog opened from the menu.
+  console.Key("Enter");
+  ASSERT_TRUE(Settled(console, "Old Password:"));
+
+  host["smartCards"][0]["valid"] = false;
+  const std::filesystem::path state = console.HostStatePath();
+  std::ofstream(state.string() + ".new") << host.dump();
+  std::filesystem::rename(state.string() + ".new", state);
+  console.Signal(SIGUSR1);
+  ASSERT_TRUE(console.WaitForLog("Logging out user id 'cardholder'"));
+  EXPECT_EQ(console.WaitExit(), 0);
+}
+
+TEST(LoginScreenTest, KeyboardLabelOnALocalConsole) {
+  TulkTest::Options options = ConsoleOptions();
+  options.term = "xterm";
+  TestConsole console(options);
+  ASSERT_TRUE(Settled(console, "Customize System/View Logs"));
+  console.Key("F2");
+  ASSERT_TRUE(Settled(console, "Configured Keyboard (US Default)"));
+  const int label = RowOf(console, "Configured Keyboard");
+  EXPECT_EQ(RowOf(console, "Login Name:"), label + 1);
+  EXPECT_EQ(RowOf(console, "Password:"), label + 2);
+  console.Key("Tab");
+  ASSERT_TRUE(WaitUntil(
+      console, [&] { return console.Cursor().row == label + 1; }, "the login name"));
+  console.Key("Up");
+  console.Key("Enter");
+  ASSERT_TRUE(Settled(console, "Configure Keyboard"));
+  console.Key("Esc");
+  ASSERT_TRUE(Gone(console, "Configure Keyboard"));
+  EXPECT_TRUE(console.Contains("Configured Keyboard (US Default)"));
+}
+
+}  // namespace

@@ -1,0 +1,190 @@
+// The password change on the real binary, opened from the System
+// Customization menu, through the real PAM library.
+
+#include <algorithm>
+#include <fstream>
+
+#include "SessionTestSupport.h"
+
+namespace {
+
+using nlohmann::json;
+using SessionTest::ConsoleOptions;
+using SessionTest::CountLog;
+using SessionTest::Gone;
+using SessionTest::LogIn;
+using SessionTest::RecordsWhere;
+using SessionTest::RowOf;
+using SessionTest::Settled;
+using SessionTest::WaitUntil;
+using TulkTest::TestConsole;
+
+constexpr char kDialogText[] = "Setting the password will prevent unauthorized access";
+
+std::string PasswordFile(const TestConsole& console) {
+  std::ifstream in(console.PamPasswordFile());
+  return std::string(std::istreambuf_iterator<char>(in), {});
+}
+
+::testing::AssertionResult OpenPasswordDialog(TestConsole& console) {
+  if (auto login = LogIn(console); !login) {
+    return login;
+  }
+  if (auto menu = SessionTest::Settled(console, "System Customization"); !menu) {
+    return menu;
+  }
+  console.Key("Enter");  // "Configure Password" is the first entry
+  return SessionTest::Settled(console, kDialogText);
+}
+
+::testing::AssertionResult CursorOn(TestConsole& console, const std::string& label) {
+  return WaitUntil(
+      console, [&] { return console.Cursor().row == RowOf(console, label); }, label);
+}
+
+std::vector<json> PasswordAudits(const TestConsole& console) {
+  return RecordsWhere(console, "audit.jsonl", "event", "account.changePassword");
+}
+
+TEST(PasswordScreenTest, WrongOldPasswordNeverReachesTheNewField) {
+  TestConsole console(ConsoleOptions());
+  ASSERT_TRUE(OpenPasswordDialog(console));
+  console.Type("not-it");
+  console.Key("Down");
+  ASSERT_TRUE(Settled(console, "The old password you entered is incorrect"));
+  EXPECT_TRUE(console.Contains("Configure Password: Error"));
+  const auto audits = PasswordAudits(console);
+  ASSERT_EQ(audits.size(), 1u);
+  EXPECT_EQ(audits[0]["result"], "failure");
+  EXPECT_EQ(audits[0]["user"], "root");
+  EXPECT_EQ(audits[0]["attributes"], json({{"reason", "Invalid login"}}));
+  console.Key("Enter");
+  ASSERT_TRUE(Gone(console, "incorrect"));
+  ASSERT_TRUE(CursorOn(console, "Old Password:"));
+  // Tab and Enter check the old password as well.
+  console.Key("Tab");
+  ASSERT_TRUE(Settled(console, "The old password you entered is incorrect"));
+  console.Key("Enter");
+  ASSERT_TRUE(CursorOn(console, "Old Password:"));
+  EXPECT_EQ(PasswordAudits(console).size(), 2u);
+}
+
+TEST(PasswordScreenTest, MismatchAndEmptyAreRefusedBeforePam) {
+  TestConsole console(ConsoleOptions());
+  ASSERT_TRUE(OpenPasswordDialog(console));
+  console.Type(SessionTest::kRootPassword);
+  console.Key("Down");
+  ASSERT_TRUE(CursorOn(console, "New Password:"));
+  console.Type("first");
+  console.Key("Down");
+  console.Type("second");
+  console.Key("Enter");
+  ASSERT_TRUE(Settled(console, "The new password and the confirmed password do not"));
+  console.Key("Enter");
+  ASSERT_TRUE(CursorOn(console, "New Password:"));
+  EXPECT_EQ(console.Row(RowOf(console, "Confirm Password:")).find('*'), std::string::npos);
+  EXPECT_EQ(console.Row(RowOf(console, "New Password:")).find('*'), std::string::npos);
+
+  console.Key("Down");
+  console.Key("Enter");
+  ASSERT_TRUE(Settled(console, "Empty passwords are not allowed."));
+  console.Key("Enter");
+  ASSERT_TRUE(CursorOn(console, "New Password:"));
+  EXPECT_TRUE(PasswordAudits(console).empty());
+  EXPECT_NE(PasswordFile(console).find("root:tulk:"), std::string::npos);
+  console.Key("Esc");
+  ASSERT_TRUE(Gone(console, kDialogText));
+  EXPECT_TRUE(console.Contains("System Customization"));
+}
+
+TEST(PasswordScreenTest, SamePasswordAsksFirstThenChangesAndReports) {
+  TestConsole console(ConsoleOptions());
+  ASSERT_TRUE(OpenPasswordDialog(console));
+  console.Type(SessionTest::kRootPassword);
+  console.Key("Down");
+  ASSERT_TRUE(CursorOn(console, "New Password:"));
+  console.Type(SessionTest::kRootPassword);
+  console.Key("Tab");
+  console.Type(SessionTest::kRootPassword);
+  console.Key("Enter");
+  ASSERT_TRUE(Settled(console, "New password is same as old password. Are you sure?"));
+  EXPECT_TRUE(console.Contains("<Enter> Confirm"));
+  console.Key("Esc");
+  ASSERT_TRUE(Gone(console, "Are you sure?"));
+  EXPECT_TRUE(console.Contains(kDialogText));
+  EXPECT_TRUE(PasswordAudits(console).empty());
+
+  console.Key("Enter");
+  ASSERT_TRUE(Settled(console, "Are you sure?"));
+  console.Key("Enter");
+  ASSERT_TRUE(Gone(console, kDialogText));
+  ASSERT_TRUE(console.WaitForLog("Login password for user root has changed"));
+  EXPECT_EQ(CountLog(console, "<14>Login password for user root has changed"), 1);
+  const auto audits = PasswordAudits(console);
+  ASSERT_EQ(audits.size(), 1u);
+  EXPECT_EQ(audits[0]["result"], "success");
+  const auto events =
+      RecordsWhere(console, "events.jsonl", "id", "qob.user.tulk.login.passwd.changed");
+  ASSERT_EQ(events.size(), 1u);
+  EXPECT_EQ(events[0]["text"], "Login password for user root changed");
+  const std::vector<std::string> commands = SessionTest::CommandLines(console);
+  const auto backup = std::find(commands.begin(), commands.end(), "backup.sh 0");
+  const auto refresh =
+      std::find(commands.begin(), commands.end(), "osk-cmd -U root internalsvc/refresh");
+  ASSERT_NE(backup, commands.end());
+  ASSERT_NE(refresh, commands.end());
+  EXPECT_LT(backup, refresh);
+  EXPECT_EQ(TulkTest::ReadHostState(console.HostStatePath())["users"]["configStoreSaves"], 1);
+}
+
+TEST(PasswordScreenTest, PamRefusingTheChangeIsReported) {
+  TulkTest::Options options = ConsoleOptions();
+  options.pamPolicy = {"root:chauthtok-fails"};
+  TestConsole console(options);
+  ASSERT_TRUE(OpenPasswordDialog(console));
+  console.Type(SessionTest::kRootPassword);
+  console.Key("Down");
+  ASSERT_TRUE(CursorOn(console, "New Password:"));
+  console.Type("weak");
+  console.Key("Down");
+  console.Type("weak");
+  console.Key("Enter");
+  ASSERT_TRUE(Settled(console, "The password change operation failed."));
+  const auto audits = PasswordAudits(console);
+  ASSERT_EQ(audits.size(), 1u);
+  EXPECT_EQ(audits[0]["attributes"], json({{"reason", "PAM error"}}));
+  console.Key("Enter");
+  ASSERT_TRUE(CursorOn(console, "New Password:"));
+  EXPECT_EQ(console.Row(RowOf(console, "Confirm Password:")).find('*'), std::string::npos);
+  EXPECT_NE(PasswordFile(console).find("root:tulk:"), std::string::npos);
+  EXPECT_EQ(CountLog(console, "<14>Login password for user root has changed"), 0);
+}
+
+TEST(PasswordScreenTest, FailedStoreStillChangesAndWarns) {
+  json host = TulkTest::DemoHostState();
+  host["faults"]["HostMgr::Authentication::StoreUserAccountsToCs"] = "store is read-only";
+  TestConsole console(ConsoleOptions(host));
+  ASSERT_TRUE(OpenPasswordDialog(console));
+  console.Type(SessionTest::kRootPassword);
+  console.Key("Down");
+  ASSERT_TRUE(CursorOn(console, "New Password:"));
+  console.Type("next-2");
+  console.Key("Down");
+  console.Type("next-2");
+  console.Key("Enter");
+  ASSERT_TRUE(Settled(console, "Configure Password: Warning"));
+  EXPECT_TRUE(console.Contains("Error while storing user account information to"));
+  EXPECT_EQ(CountLog(console, "<11>Error persisting changes to config store"), 1);
+  EXPECT_EQ(CountLog(console,
+                     "<11>Error while storing user account information to persistent storage. "
+                     "The new information may not be available after reboot. Error: store is "
+                     "read-only"),
+            1);
+  EXPECT_EQ(CountLog(console, "<14>Login password for user root has changed"), 1);
+  EXPECT_NE(PasswordFile(console).find("root:next-2:"), std::string::npos);
+  console.Key("Enter");
+  ASSERT_TRUE(Gone(console, kDialogText));
+  EXPECT_TRUE(console.Contains("System Customization"));
+}
+
+}  // namespace

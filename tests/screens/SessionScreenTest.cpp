@@ -1,0 +1,76 @@
+// Sessions on the real binary: logout, the idle timeout and a deferred
+// exit request.
+
+#include <signal.h>
+
+#include "SessionTestSupport.h"
+
+namespace {
+
+using nlohmann::json;
+using SessionTest::ConsoleOptions;
+using SessionTest::CountLog;
+using SessionTest::Gone;
+using SessionTest::LogIn;
+using SessionTest::RecordsWhere;
+using SessionTest::Settled;
+using TulkTest::TestConsole;
+
+TEST(SessionScreenTest, EscFromTheMenuLogsOut) {
+  TestConsole console(ConsoleOptions());
+  ASSERT_TRUE(LogIn(console));
+  ASSERT_TRUE(Settled(console, "System Customization"));
+  console.Key("Esc");
+  ASSERT_TRUE(Settled(console, "To manage this host"));
+  ASSERT_TRUE(console.WaitForLog("User root logged out"));
+  EXPECT_EQ(CountLog(console, "<14>User root logged out"), 1);
+  const auto logouts = RecordsWhere(console, "audit.jsonl", "event", "tulk.logout");
+  ASSERT_EQ(logouts.size(), 1u);
+  EXPECT_EQ(logouts[0]["user"], "root");
+  EXPECT_EQ(logouts[0]["component"], "tulk");
+  EXPECT_EQ(logouts[0]["attributes"], json({{"reason", "Session closed"}}));
+
+  // A second session by another user.
+  ASSERT_TRUE(LogIn(console, "operator", "operator"));
+  ASSERT_TRUE(Settled(console, "System Customization"));
+  console.Key("Esc");
+  ASSERT_TRUE(console.WaitForLog("User operator logged out"));
+}
+
+TEST(SessionScreenTest, IdleTimeoutEndsTheSession) {
+  json host = TulkTest::DemoHostState();
+  host["advancedOptions"]["/UserVars/TulkTimeOut"] = 60;
+  TulkTest::Options options = ConsoleOptions(host);
+  options.timeScale = 30;  // the minute passes in two seconds
+  TestConsole console(options);
+  ASSERT_TRUE(LogIn(console));
+  ASSERT_TRUE(Settled(console, "System Customization"));
+  ASSERT_TRUE(console.WaitForLog("User root logged out due to time out", std::chrono::seconds(8)));
+  ASSERT_TRUE(Settled(console, "To manage this host"));
+  EXPECT_FALSE(console.Contains("System Customization"));
+  EXPECT_EQ(CountLog(console, "<14>User root logged out"), 0);
+  const auto logouts = RecordsWhere(console, "audit.jsonl", "event", "tulk.logout");
+  ASSERT_EQ(logouts.size(), 1u);
+  EXPECT_EQ(logouts[0]["attributes"], json({{"reason", "Time out"}}));
+
+  // The welcome screen itself never times out, and takes keys again.
+  console.Key("F2");
+  ASSERT_TRUE(Settled(console, "Authentication Required"));
+}
+
+TEST(SessionScreenTest, Sigusr2DuringASessionExitsAfterLogout) {
+  TestConsole console(ConsoleOptions());
+  ASSERT_TRUE(LogIn(console));
+  ASSERT_TRUE(Settled(console, "System Customization"));
+  console.Signal(SIGUSR2);
+  console.Key("Down");
+  console.WaitQuiet();
+  EXPECT_TRUE(console.Running());
+  EXPECT_TRUE(console.Contains("System Customization"));
+  console.Key("Esc");
+  EXPECT_EQ(console.WaitExit(), 0);
+  EXPECT_EQ(CountLog(console, "<14>User root logged out"), 1);
+  EXPECT_EQ(RecordsWhere(console, "audit.jsonl", "event", "tulk.logout").size(), 1u);
+}
+
+}  // namespace

@@ -1,0 +1,116 @@
+#include "SessionTestSupport.h"
+
+#include <algorithm>
+#include <thread>
+
+namespace SessionTest {
+
+TulkTest::Options ConsoleOptions(const nlohmann::json& host,
+                                 std::function<void(const std::filesystem::path&)> prepare) {
+  TulkTest::Options options;
+  options.hostState = host.dump();
+  options.pamUsers = {{"root", kRootPassword}, {"operator", "operator"}};
+  options.prepareRoot = [prepare](const std::filesystem::path& root) {
+    TulkTest::WriteRootFile(root, "/var/run/brimlo/show-tulk-login");
+    if (prepare) {
+      prepare(root);
+    }
+  };
+  return options;
+}
+
+::testing::AssertionResult LogIn(TulkTest::TestConsole& console, const std::string& user,
+                                 const std::string& password, const std::string& key) {
+  if (auto welcome = Settled(console, "Customize System/View Logs"); !welcome) {
+    return welcome;
+  }
+  console.Key(key);
+  if (auto shown = Settled(console, "Authentication Required"); !shown) {
+    return shown;
+  }
+  if (user != "root") {
+    console.Type(user);
+  }
+  console.Key("Down");
+  console.Type(password);
+  console.Key("Enter");
+  return ::testing::AssertionSuccess();
+}
+
+::testing::AssertionResult Settled(TulkTest::TestConsole& console, const std::string& text) {
+  auto shown = console.WaitForText(text);
+  console.WaitQuiet();
+  return shown;
+}
+
+::testing::AssertionResult Gone(TulkTest::TestConsole& console, const std::string& text) {
+  auto gone = console.WaitForTextGone(text);
+  console.WaitQuiet();
+  return gone;
+}
+
+::testing::AssertionResult WaitUntil(TulkTest::TestConsole& console,
+                                     const std::function<bool()>& condition,
+                                     const std::string& what, std::chrono::milliseconds timeout) {
+  const auto deadline = std::chrono::steady_clock::now() + timeout;
+  while (!condition()) {
+    if (std::chrono::steady_clock::now() > deadline) {
+      return ::testing::AssertionFailure() << "timed out waiting for " << what << "\n"
+                                           << console.Dump();
+    }
+    console.Pump(std::chrono::milliseconds(20));
+  }
+  return ::testing::AssertionSuccess();
+}
+
+std::vector<nlohmann::json> RecordsWhere(const TulkTest::TestConsole& console,
+                                         const std::string& file, const std::string& key,
+                                         const std::string& value) {
+  std::vector<nlohmann::json> matching;
+  for (const nlohmann::json& record : TulkTest::SimRecords(console.Root(), file)) {
+    if (record.is_object() && record.value(key, "") == value) {
+      matching.push_back(record);
+    }
+  }
+  return matching;
+}
+
+std::vector<std::string> CommandLines(const TulkTest::TestConsole& console) {
+  std::vector<std::string> lines;
+  for (const nlohmann::json& record : TulkTest::SimRecords(console.Root(), "commands.jsonl")) {
+    std::string line;
+    for (const nlohmann::json& word : record.value("argv", nlohmann::json::array())) {
+      line += (line.empty() ? "" : " ") + word.get<std::string>();
+    }
+    lines.push_back(line);
+  }
+  return lines;
+}
+
+int CountLog(const TulkTest::TestConsole& console, const std::string& line) {
+  const std::vector<std::string> lines = console.LogLines();
+  return static_cast<int>(std::count(lines.begin(), lines.end(), line));
+}
+
+int RowOf(const TulkTest::TestConsole& console, const std::string& text, int rows) {
+  for (int row = 0; row < rows; ++row) {
+    if (console.Row(row).find(text) != std::string::npos) {
+      return row;
+    }
+  }
+  return -1;
+}
+
+}  // namespace SessionTest
+
+namespace SessionTest {
+
+std::string Cells(const TulkTest::TestConsole& console, int row, int column, int count) {
+  std::string text;
+  for (int c = column; c < column + count; ++c) {
+    text += console.At(row, c).text;
+  }
+  return text;
+}
+
+}  // namespace SessionTest

@@ -1,0 +1,66 @@
+#pragma once
+// Helpers of the session screens' tests: a console with PAM users and the
+// console-login marker, logging in, and waiting on the simulated host's
+// record files.
+
+#include <chrono>
+#include <functional>
+#include <string>
+#include <vector>
+
+#include <nlohmann/json.hpp>
+
+#include "ScreenTestSupport.h"
+#include "TestConsole.h"
+
+namespace SessionTest {
+
+/// The demo users of the test PAM service.
+inline constexpr char kRootPassword[] = "tulk";
+
+/// Options for `host` with the PAM users root/"tulk" and operator/"operator"
+/// and the console-login marker in the root. `prepare`, when given, runs
+/// after the marker is written.
+TulkTest::Options ConsoleOptions(
+    const nlohmann::json& host = TulkTest::DemoHostState(),
+    std::function<void(const std::filesystem::path&)> prepare = nullptr);
+
+/// Waits for the settled welcome screen, opens the login with `key` ("F2"
+/// or "F12"), enters `user` (replacing the
+/// pre-filled "root" unless it is root) and `password`, and presses Enter.
+::testing::AssertionResult LogIn(TulkTest::TestConsole& console, const std::string& user = "root",
+                                 const std::string& password = kRootPassword,
+                                 const std::string& key = "F2");
+
+/// Waits for `text` to appear (or, for Gone, to disappear), then until the
+/// console has been quiet for a moment. Every full draw of a frame discards
+/// typed-ahead keys, so a key is sent only once the screen has settled.
+::testing::AssertionResult Settled(TulkTest::TestConsole& console, const std::string& text);
+::testing::AssertionResult Gone(TulkTest::TestConsole& console, const std::string& text);
+
+/// Waits until `condition` holds, pumping the console's output meanwhile.
+::testing::AssertionResult WaitUntil(TulkTest::TestConsole& console,
+                                     const std::function<bool()>& condition,
+                                     const std::string& what,
+                                     std::chrono::milliseconds timeout = std::chrono::seconds(5));
+
+/// The records of `file` (audit.jsonl, events.jsonl, commands.jsonl) whose
+/// `key` equals `value`.
+std::vector<nlohmann::json> RecordsWhere(const TulkTest::TestConsole& console,
+                                         const std::string& file, const std::string& key,
+                                         const std::string& value);
+
+/// The commands the simulated tools ran, each argv joined by blanks.
+std::vector<std::string> CommandLines(const TulkTest::TestConsole& console);
+
+/// How many system-log lines equal `line` ("<14>User root logged in").
+int CountLog(const TulkTest::TestConsole& console, const std::string& line);
+
+/// The text of `count` cells from `row`, `column` (box characters count as
+/// one cell).
+std::string Cells(const TulkTest::TestConsole& console, int row, int column, int count);
+
+/// The first screen row (of `rows`) holding `text`, or -1.
+int RowOf(const TulkTest::TestConsole& console, const std::string& text, int rows = 25);
+
+}  // namespace SessionTest

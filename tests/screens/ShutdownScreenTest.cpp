@@ -1,0 +1,136 @@
+// Shutdown and restart on the real binary: F12 on the welcome screen, the
+// check box, the host's commands and what the simulated host records.
+
+#include <algorithm>
+
+#include "SessionTestSupport.h"
+
+namespace {
+
+using nlohmann::json;
+using SessionTest::CommandLines;
+using SessionTest::ConsoleOptions;
+using SessionTest::CountLog;
+using SessionTest::Gone;
+using SessionTest::LogIn;
+using SessionTest::RecordsWhere;
+using SessionTest::Settled;
+using SessionTest::WaitUntil;
+using TulkTest::TestConsole;
+
+bool Ran(const TestConsole& console, const std::string& line) {
+  const std::vector<std::string> commands = CommandLines(console);
+  return std::find(commands.begin(), commands.end(), line) != commands.end();
+}
+
+int CountRuns(const TestConsole& console, const std::string& name) {
+  const std::vector<std::string> commands = CommandLines(console);
+  return static_cast<int>(std::count_if(commands.begin(), commands.end(), [&](const auto& line) {
+    return line == name || line.rfind(name + " ", 0) == 0;
+  }));
+}
+
+::testing::AssertionResult OpenShutdown(TestConsole& console) {
+  if (auto login = LogIn(console, "root", SessionTest::kRootPassword, "F12"); !login) {
+    return login;
+  }
+  return console.WaitForText("[ ] Forcefully terminate running VMs, if any ...");
+}
+
+std::string Power(const TestConsole& console) {
+  return TulkTest::ReadHostState(console.HostStatePath()).value("power", "");
+}
+
+TEST(ShutdownScreenTest, EscLeavesWithoutRunningAnything) {
+  TestConsole console(ConsoleOptions());
+  ASSERT_TRUE(OpenShutdown(console));
+  EXPECT_TRUE(console.Contains("Remote management software is recommended to safely"));
+  EXPECT_TRUE(console.Contains("<F2> Shut Down  <F11> Restart"));
+  console.Key("Space");
+  ASSERT_TRUE(Settled(console, "[X] Forcefully terminate"));
+  console.Key("Enter");
+  console.Key("Esc");
+  ASSERT_TRUE(Settled(console, "To manage this host"));
+  console.WaitQuiet();
+  EXPECT_EQ(CountRuns(console, "powerOffVms") + CountRuns(console, "poweroff") +
+                CountRuns(console, "reboot"),
+            0);
+  EXPECT_EQ(Power(console), "on");
+  // Shutting down is not a session: no logout is recorded.
+  EXPECT_TRUE(RecordsWhere(console, "audit.jsonl", "event", "tulk.logout").empty());
+}
+
+TEST(ShutdownScreenTest, ShutDownKeepsMachinesGracefulUnlessTicked) {
+  TestConsole console(ConsoleOptions());
+  ASSERT_TRUE(OpenShutdown(console));
+  console.Key("F2");
+  ASSERT_TRUE(Settled(console, "Shutdown in progress..."));
+  EXPECT_TRUE(console.Contains("Shut Down Host"));
+  ASSERT_TRUE(WaitUntil(
+      console, [&] { return Ran(console, "poweroff"); }, "poweroff"));
+  EXPECT_TRUE(Ran(console, "osk-cmd -U root hostsvc/autostartmanager/autostop"));
+  EXPECT_TRUE(Ran(console, "powerOffVms"));
+  EXPECT_FALSE(Ran(console, "powerOffVms --terminate"));
+  EXPECT_EQ(Power(console), "off");
+  EXPECT_EQ(CountLog(console, "<14>Shutting down host"), 1);
+  EXPECT_EQ(RecordsWhere(console, "events.jsonl", "id", "qob.user.tulk.shutdown.host").size(), 1u);
+
+  // The console waits for the host to go down and ignores keys meanwhile.
+  console.Key("Esc");
+  console.Key("Enter");
+  console.WaitQuiet();
+  EXPECT_TRUE(console.Contains("Shutdown in progress..."));
+  EXPECT_TRUE(console.Running());
+}
+
+TEST(ShutdownScreenTest, RestartTerminatesMachinesWhenTicked) {
+  TestConsole console(ConsoleOptions());
+  ASSERT_TRUE(OpenShutdown(console));
+  console.Key("Space");
+  ASSERT_TRUE(Settled(console, "[X] Forcefully terminate"));
+  console.Key("F11");
+  ASSERT_TRUE(Settled(console, "Restart in progress..."));
+  EXPECT_TRUE(console.Contains("Restart Host"));
+  ASSERT_TRUE(WaitUntil(
+      console, [&] { return Ran(console, "reboot"); }, "reboot"));
+  EXPECT_TRUE(Ran(console, "powerOffVms --terminate"));
+  EXPECT_EQ(Power(console), "rebooting");
+  EXPECT_EQ(CountLog(console, "<14>Rebooting host"), 1);
+  const auto events = RecordsWhere(console, "events.jsonl", "id", "qob.user.tulk.reboot.host");
+  ASSERT_EQ(events.size(), 1u);
+  EXPECT_EQ(events[0]["text"], "Rebooting host");
+}
+
+TEST(ShutdownScreenTest, RestartThatCannotStartReturnsToTheDialog) {
+  TulkTest::Options options = ConsoleOptions(
+      TulkTest::DemoHostState(),
+      [](const std::filesystem::path& root) { std::filesystem::remove(root / "bin/sh"); });
+  TestConsole console(options);
+  ASSERT_TRUE(OpenShutdown(console));
+  console.Key("F11");
+  ASSERT_TRUE(console.WaitForLog("Rebooting host"));
+  ASSERT_TRUE(Gone(console, "Restart in progress..."));
+  ASSERT_TRUE(Settled(console, "[ ] Forcefully terminate"));
+  console.Key("F11");
+  ASSERT_TRUE(WaitUntil(
+      console, [&] { return CountRuns(console, "powerOffVms") == 2; }, "a second try"));
+  ASSERT_TRUE(Settled(console, "[ ] Forcefully terminate"));
+  EXPECT_EQ(CountLog(console, "<14>Rebooting host"), 2);
+  EXPECT_EQ(Power(console), "on");
+}
+
+TEST(ShutdownScreenTest, RestartCommandThatFailsKeepsWaiting) {
+  json host = TulkTest::DemoHostState();
+  host["commands"]["reboot"] = {{"exitCode", 1}};
+  TestConsole console(ConsoleOptions(host));
+  ASSERT_TRUE(OpenShutdown(console));
+  console.Key("F11");
+  ASSERT_TRUE(WaitUntil(
+      console, [&] { return Ran(console, "reboot"); }, "reboot"));
+  console.Key("Esc");
+  console.WaitQuiet();
+  EXPECT_TRUE(console.Contains("Restart in progress..."));
+  EXPECT_EQ(Power(console), "on");
+}
+
+}  // namespace

@@ -1,0 +1,228 @@
+// The welcome screen on the real binary: the summary drawn from the
+// simulated host, its layouts and warnings, and the way out on a host
+// failure.
+
+#include <signal.h>
+
+#include <fstream>
+
+#include "SessionTestSupport.h"
+#include "include/ColorNumbers.h"
+
+namespace {
+
+using nlohmann::json;
+using SessionTest::ConsoleOptions;
+using SessionTest::Gone;
+using SessionTest::Settled;
+using SessionTest::WaitUntil;
+using TulkTest::DemoHostState;
+using TulkTest::TestConsole;
+
+// Rows of the standard summary on 80 x 25.
+constexpr int kVersionRow = 5;
+constexpr int kHardwareRow = 7;
+constexpr int kProcessorRow = 9;
+constexpr int kMemoryRow = 10;
+constexpr int kAddressRow = 13;
+constexpr int kWarningRow = 21;
+constexpr int kFooterRow = 23;
+
+json& ManagementNic(json& host) {
+  return host["network"]["hykernelNics"][0];
+}
+
+std::vector<json> Ipv6Networks(int count) {
+  std::vector<json> networks;
+  for (int i = 1; i <= count; ++i) {
+    networks.push_back({{"address", "2001:db8:0:" + std::to_string(i) + "::1"},
+                        {"prefix", 64},
+                        {"type", 0},
+                        {"scope", 3}});
+  }
+  return networks;
+}
+
+// Replaces the state file as a whole, so that the console re-reads it.
+void ReplaceHostState(const TestConsole& console, const json& host) {
+  const std::filesystem::path path = console.HostStatePath();
+  const std::filesystem::path temporary = path.string() + ".new";
+  std::ofstream(temporary) << host.dump();
+  std::filesystem::rename(temporary, path);
+}
+
+TEST(WelcomeScreenTest, ShowsTheDemoHostInTwoPanels) {
+  TestConsole console(ConsoleOptions());
+  ASSERT_TRUE(Settled(console, "To manage this host, go to:"));
+  console.WaitQuiet();
+
+  EXPECT_EQ(SessionTest::Cells(console, kVersionRow, 8, 27), "Brimlo Tavi 8.1.0 (HyKernel");
+  EXPECT_EQ(SessionTest::Cells(console, kHardwareRow, 8, 36),
+            "Kestrel Computing KX2200 Rack Server");
+  EXPECT_NE(console.Row(kProcessorRow).find("2 x Helix H6-4316 16-Core Processor @ 2.30GHz"),
+            std::string::npos);
+  EXPECT_NE(console.Row(kMemoryRow).find("64 GiB Memory"), std::string::npos);
+  const std::vector<std::string> addresses = {
+      "To manage this host, go to:",
+      "https://tavi-01/",
+      "https://10.20.30.41/ (STATIC)",
+      "https://[2001:db8:20:30:6b:4eff:fe10:2001]/ (AUTOCONF)",
+      "https://[2001:db8:20:30::41]/ (STATIC)",
+      "https://[fe80::6b:4eff:fe10:2001]/"};
+  for (std::size_t i = 0; i < addresses.size(); ++i) {
+    EXPECT_EQ(SessionTest::Cells(console, kAddressRow + static_cast<int>(i), 8,
+                                 static_cast<int>(addresses[i].size())),
+              addresses[i]);
+  }
+  EXPECT_NE(console.Row(kFooterRow).find("<F2> Customize System/View Logs"), std::string::npos);
+  EXPECT_NE(console.Row(kFooterRow).find("<F12> Shut Down/Restart "), std::string::npos);
+
+  EXPECT_EQ(console.At(3, 40).bg, Tulk::kDarkGrey);
+  EXPECT_EQ(console.At(kHardwareRow, 8).fg, Tulk::kWhite);
+  EXPECT_EQ(console.At(18, 40).bg, Tulk::kYellow);
+  EXPECT_EQ(console.At(kAddressRow, 8).fg, Tulk::kBlack);
+  const int legend = static_cast<int>(console.Row(kFooterRow).find("Customize"));
+  EXPECT_EQ(console.At(kFooterRow, legend).fg, Tulk::kDarkGrey);
+  EXPECT_EQ(console.At(kFooterRow, 2).fg, Tulk::kBlack);
+  EXPECT_EQ(console.At(0, 0).text, "┌");
+}
+
+TEST(WelcomeScreenTest, F4TogglesMonochromeAndOtherKeysRepaint) {
+  TestConsole console(ConsoleOptions());
+  ASSERT_TRUE(Settled(console, "To manage this host"));
+  console.WaitQuiet();
+  console.Key("F4");
+  ASSERT_TRUE(WaitUntil(
+      console, [&] { return console.At(3, 40).reverse; }, "standout panel"));
+  EXPECT_FALSE(console.At(18, 40).reverse);
+  EXPECT_NE(console.At(18, 40).bg, Tulk::kYellow);
+
+  console.Key("F4");
+  ASSERT_TRUE(WaitUntil(
+      console, [&] { return console.At(18, 40).bg == Tulk::kYellow; }, "colours"));
+  EXPECT_FALSE(console.At(3, 40).reverse);
+
+  const std::size_t before = console.BytesReceived();
+  console.Type("x");
+  console.WaitQuiet();
+  // A full repaint: every cell is sent again.
+  EXPECT_GT(console.BytesReceived() - before, 80u * 20u);
+  EXPECT_TRUE(console.Contains("https://10.20.30.41/ (STATIC)"));
+}
+
+TEST(WelcomeScreenTest, HardwareAndMemoryLinesOfAnotherHost) {
+  json host = DemoHostState();
+  host["hardware"]["vendor"] = " Acme  Inc. ";
+  host["hardware"]["product"] = "Acme   Server 9";
+  host["hardware"]["cpu"]["packages"] = 1;
+  host["hardware"]["cpu"]["model"] = "Helix  H2";
+  host["hardware"]["memory"] = {{"totalPages", 393216}, {"pageSize", 4096}};
+  TestConsole console(ConsoleOptions(host));
+  ASSERT_TRUE(Settled(console, "1.5 GiB Memory"));
+  EXPECT_EQ(SessionTest::Cells(console, kHardwareRow, 8, 24), "Acme Inc. Acme Server 9 ");
+  EXPECT_EQ(SessionTest::Cells(console, kProcessorRow, 8, 10), "Helix H2  ");
+}
+
+TEST(WelcomeScreenTest, FiveIpv6AddressesAreAllListedSixAreCut) {
+  for (int count : {5, 6}) {
+    json host = DemoHostState();
+    host["network"]["dns"]["hostname"] = "localhost";
+    ManagementNic(host)["ipv4"] = {{"mode", "none"}};
+    ManagementNic(host)["ipv6"]["networks"] = Ipv6Networks(count);
+    TestConsole console(ConsoleOptions(host));
+    ASSERT_TRUE(Settled(console, "https://[2001:db8:0:4::1]/ (STATIC)")) << count;
+    console.WaitQuiet();
+    EXPECT_EQ(SessionTest::Cells(console, kAddressRow + 1, 8, 30), "https://[2001:db8:0:1::1]/ (ST")
+        << "no host name or IPv4 line for localhost without IPv4";
+    EXPECT_EQ(console.Contains("https://[2001:db8:0:5::1]/"), count == 5) << count;
+    EXPECT_EQ(SessionTest::Cells(console, kAddressRow + 5, 8, 3) == "...", count == 6) << count;
+    EXPECT_FALSE(console.Contains("https://[2001:db8:0:6::1]/"));
+  }
+}
+
+TEST(WelcomeScreenTest, DhcpWithoutLeaseWaitsAndWarns) {
+  json host = DemoHostState();
+  ManagementNic(host)["ipv4"] = {{"mode", "dhcp"}};
+  ManagementNic(host)["dhcpLease"] = nullptr;
+  TestConsole console(ConsoleOptions(host));
+  ASSERT_TRUE(Settled(console, "https://0.0.0.0/ (Waiting for DHCP...)"));
+  console.WaitQuiet();
+  EXPECT_EQ(SessionTest::Cells(console, kWarningRow, 16, 28), "Warning: DHCP lookup failed.");
+  EXPECT_EQ(console.At(kWarningRow, 16).fg, Tulk::kDarkGrey);
+}
+
+TEST(WelcomeScreenTest, AuditModeWarningReplacesTheDhcpWarning) {
+  json host = DemoHostState();
+  ManagementNic(host)["ipv4"] = {{"mode", "dhcp"}};
+  host["system"]["bootOption"] = 1;
+  TestConsole console(ConsoleOptions(host));
+  ASSERT_TRUE(Settled(console, "Warning: Host is running in audit mode."));
+  EXPECT_FALSE(console.Contains("DHCP lookup failed"));
+}
+
+TEST(WelcomeScreenTest, NoPhysicalNicRaisesTheAlertOnce) {
+  json host = DemoHostState();
+  host["network"]["pnics"] = json::array();
+  TestConsole console(ConsoleOptions(host));
+  ASSERT_TRUE(Settled(console, "No compatible network adapter found. Please consult the"));
+  EXPECT_FALSE(console.Contains("To manage this host"));
+  console.Type("x");
+  console.Key("F4");
+  console.WaitQuiet();
+  const json alerts = TulkTest::ReadHostState(console.HostStatePath())["system"]["alerts"];
+  EXPECT_EQ(alerts, json::array({"No compatible network adapter found."}));
+}
+
+TEST(WelcomeScreenTest, CustomMessageAndBackOnReload) {
+  json host = DemoHostState();
+  host["system"]["welcomeMessage"] = "Lab host of team {color:red}Blue{/color}\nCall 1234";
+  TestConsole console(ConsoleOptions(host));
+  ASSERT_TRUE(Settled(console, "Lab host of team Blue"));
+  console.WaitQuiet();
+  EXPECT_EQ(SessionTest::Cells(console, 2, 0, 24), "│ Lab host of team Blue ");
+  EXPECT_EQ(console.At(2, 19).fg, Tulk::kRed);
+  EXPECT_EQ(SessionTest::Cells(console, 3, 2, 9), "Call 1234");
+  EXPECT_FALSE(console.Contains("Customize System"));
+
+  host["system"]["welcomeMessage"] = "";
+  host["network"]["dns"]["hostname"] = "tavi-77";
+  ReplaceHostState(console, host);
+  console.Signal(SIGUSR1);
+  ASSERT_TRUE(Settled(console, "https://tavi-77/"));
+  EXPECT_FALSE(console.Contains("Lab host"));
+  EXPECT_TRUE(console.Contains("<F2> Customize System/View Logs"));
+}
+
+TEST(WelcomeScreenTest, HostFailureEndsTheRunWithStatusZero) {
+  json host = DemoHostState();
+  host["faults"]["HykCtl::Hardware::CpuInfoImpl::GetModelName"] = "processor query failed";
+  TestConsole console(ConsoleOptions(host));
+  ASSERT_TRUE(console.WaitForLog("TULK aborted by exception: processor query failed"));
+  EXPECT_EQ(console.WaitExit(), 0);
+  EXPECT_EQ(SessionTest::CountLog(console, "<11>TULK aborted by exception: processor query failed"),
+            1);
+}
+
+TEST(WelcomeScreenTest, LoginDisabledDialogLeadsBackToTheSummary) {
+  TulkTest::Options options = ConsoleOptions();
+  options.prepareRoot = nullptr;  // no console-login marker
+  TestConsole console(options);
+  ASSERT_TRUE(Settled(console, "To manage this host"));
+  for (const char* close : {"Esc", "Enter"}) {
+    console.Key("F12");
+    ASSERT_TRUE(Settled(console, "Authentication Denied"));
+    EXPECT_TRUE(console.Contains("Direct console access has been disabled by the"));
+    EXPECT_TRUE(console.Contains("administrator for tavi-01.lab.example.net."));
+    console.Type("x");
+    console.Key(close);
+    ASSERT_TRUE(Gone(console, "Authentication Denied")) << close;
+  }
+  console.Key("F2");
+  ASSERT_TRUE(Settled(console, "Authentication Denied"));
+  console.Key("Esc");
+  ASSERT_TRUE(Gone(console, "Authentication Denied"));
+  EXPECT_TRUE(SessionTest::RecordsWhere(console, "audit.jsonl", "event", "tulk.login").empty());
+  EXPECT_TRUE(console.Running());
+}
+
+}  // namespace
