@@ -91,6 +91,12 @@ void GeneralWindow::BuildEntries() {
     item->SetEnabled(entry.enabled);
     items_.push_back(std::move(item));
   }
+  // The menu must never point at the items just replaced.
+  std::vector<Item*> items;
+  for (auto& item : items_) {
+    items.push_back(item.get());
+  }
+  Menu().SetItems(items);
 }
 
 void GeneralWindow::Populate() {
@@ -98,11 +104,7 @@ void GeneralWindow::Populate() {
   const std::uint32_t keep = selected_;
   SetLeftTitle(Text(4));
   SetLeftFooter(kSelectFooter);
-  std::vector<Item*> items;
-  for (auto& item : items_) {
-    items.push_back(item.get());
-  }
-  Menu().SetItems(items);
+  Menu().SetItems(Menu().Items());
   SelectId(keep);
   selected_ = SelectedId();
   Menu().Draw();

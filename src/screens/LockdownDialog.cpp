@@ -2,7 +2,6 @@
 
 #include "host/HostTools.h"
 #include "include/Keys.h"
-#include "toolkit/CheckItem.h"
 #include "toolkit/ItemList.h"
 #include "toolkit/MessageDialog.h"
 #include "toolkit/RunFrame.h"
@@ -20,18 +19,16 @@ constexpr char kFooter[] =
 LockdownDialog::LockdownDialog(Frame* owner)
     : Dialog(owner, 60, 11, 6),
       wasEnabled_(OskCmdGetFlag("osksvc/auth/lockdown_is_enabled")),
-      box_(new CheckItem(Text(256), wasEnabled_)),
+      box_(Text(256), wasEnabled_),
       list_(new ItemList(Content(), 0, 0, Content()->Width(), Content()->Height())) {
-  list_->SetItems({box_});
+  list_->SetItems({&box_});
   Fill();
 }
 
-LockdownDialog::~LockdownDialog() {
-  delete box_;
-}
+LockdownDialog::~LockdownDialog() = default;
 
 bool LockdownDialog::Ticked() const {
-  return box_->Checked();
+  return box_.Checked();
 }
 
 void LockdownDialog::Fill() {
@@ -50,7 +47,7 @@ int LockdownDialog::Run() {
       return 0;
     }
     if (key == kKeySpace) {
-      box_->Toggle();
+      box_.Toggle();
       list_->Draw();
     } else if (key == kKeyEnter) {
       break;

@@ -16,11 +16,11 @@
 /// "Please check the syslog for more information." (280) is shown before
 /// the dialog returns 1 (the caller reads the state again either way).
 
+#include "toolkit/CheckItem.h"
 #include "toolkit/Dialog.h"
 
 namespace Tulk {
 
-class CheckItem;
 class ItemList;
 
 class LockdownDialog : public Dialog {
@@ -41,7 +41,7 @@ class LockdownDialog : public Dialog {
   void Fill();
 
   bool wasEnabled_;
-  CheckItem* box_;
+  CheckItem box_;
   ItemList* list_;
 };
 

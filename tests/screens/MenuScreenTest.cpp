@@ -3,6 +3,7 @@
 // screens of other folders opened through the registry.
 
 #include <gtest/gtest.h>
+#include <signal.h>
 
 #include <filesystem>
 #include <fstream>
@@ -217,9 +218,7 @@ TEST(MenuScreenTest, RegisteredScreensOpenAndAVanishedInterfaceIsReported) {
 
   Json host = TulkTest::ReadHostState(console.HostStatePath());
   host["network"].erase("managementInterface");
-  const auto fresh = console.HostStatePath().string() + ".new";
-  std::ofstream(fresh) << host.dump();
-  std::filesystem::rename(fresh, console.HostStatePath());
+  MenuTest::ReplaceHostState(console, host);
 
   ASSERT_TRUE(SelectEntry(console, "Restart Management Network"));
   console.Key("Enter");
@@ -230,6 +229,49 @@ TEST(MenuScreenTest, RegisteredScreensOpenAndAVanishedInterfaceIsReported) {
   EXPECT_TRUE(console.WaitForText("Management network interface cannot be found."));
   console.Key("Enter");
   EXPECT_TRUE(console.WaitForTextGone("cannot be found"));
+}
+
+}  // namespace
+
+namespace {
+
+TEST(MenuScreenTest, ReloadSignalReadsTheHostAgainAndKeepsTheSelection) {
+  TestConsole console(DriverOptions());
+  ASSERT_TRUE(SelectEntry(console, "View System Logs"));
+  const int lockdownRow = RowOf(console, "Configure Lockdown Mode");
+  EXPECT_NE(console.At(lockdownRow, 3).fg, kDarkGrey);
+
+  Json host = TulkTest::ReadHostState(console.HostStatePath());
+  host["lockdown"]["possible"] = false;
+  host["network"].erase("managementInterface");
+  MenuTest::ReplaceHostState(console, host);
+  console.Signal(SIGUSR1);
+
+  EXPECT_TRUE(MenuTest::WaitUntil(
+      console, [&] { return console.At(lockdownRow, 3).fg == kDarkGrey; }, "greyed lockdown"));
+  EXPECT_EQ(console.At(RowOf(console, "Test Management Network"), 3).fg, kDarkGrey);
+  EXPECT_EQ(RightTitle(console), "View System Logs");
+  console.Key("Up");
+  EXPECT_TRUE(MenuTest::WaitUntil(
+      console, [&] { return RightTitle(console) == "Troubleshooting Options"; }, "a move"));
+}
+
+// A Down redraws only the two rows and the right half: the first one (to
+// "Configure Lockdown Mode") stays under 600 bytes, and none comes near a
+// full repaint of the screen (over 2,000 bytes).
+TEST(MenuScreenTest, OneDownFitsASlowSerialLine) {
+  TestConsole console(DriverOptions());
+  ASSERT_TRUE(MenuTest::Shown(console, "System Customization"));
+  for (int step = 0; step < 9; ++step) {  // to the last entry
+    const std::size_t before = console.BytesReceived();
+    const std::string from = RightTitle(console);
+    console.Key("Down");
+    ASSERT_TRUE(MenuTest::WaitUntil(
+        console, [&] { return RightTitle(console) != from; }, "a move"));
+    console.WaitQuiet();
+    const std::size_t bytes = console.BytesReceived() - before;
+    EXPECT_LT(bytes, step == 0 ? 600U : 1000U) << from << " -> " << RightTitle(console);
+  }
 }
 
 }  // namespace

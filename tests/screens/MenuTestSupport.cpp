@@ -68,6 +68,12 @@ std::string RightTitle(const TulkTest::TestConsole& console, int cols) {
   return ::testing::AssertionFailure() << "no entry " << title << "\n" << console.Dump();
 }
 
+void ReplaceHostState(const TulkTest::TestConsole& console, const nlohmann::json& host) {
+  const std::filesystem::path fresh = console.HostStatePath().string() + ".new";
+  std::ofstream(fresh) << host.dump();
+  std::filesystem::rename(fresh, console.HostStatePath());
+}
+
 std::string ReadText(const std::filesystem::path& path) {
   std::ifstream in(path);
   std::stringstream text;

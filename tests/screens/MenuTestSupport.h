@@ -38,6 +38,10 @@ std::string RightTitle(const TulkTest::TestConsole& console, int cols = 80);
 ::testing::AssertionResult SelectEntry(TulkTest::TestConsole& console, const std::string& title,
                                        int cols = 80);
 
+/// Replaces the console's host state file atomically (the console and the
+/// simulated tools then read the new state).
+void ReplaceHostState(const TulkTest::TestConsole& console, const nlohmann::json& host);
+
 /// The whole text of a file (empty when missing).
 std::string ReadText(const std::filesystem::path& path);
 
