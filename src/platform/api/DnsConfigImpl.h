@@ -16,6 +16,7 @@ namespace HykCtl::Network {
 /// does not have (the host has "defaultTcpipStack").
 class DnsConfigImpl {
  public:
+  /// The DNS settings of the TCP/IP stack `stack`.
   explicit DnsConfigImpl(std::string stack = "defaultTcpipStack");
 
   /// Re-reads the configuration from the host.

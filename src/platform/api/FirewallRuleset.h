@@ -13,6 +13,7 @@ class FirewallRuleset {
   /// host has none of that id.
   explicit FirewallRuleset(std::string id);
 
+  /// The ruleset's id.
   const std::string& GetId() const { return id_; }
   /// True while the ruleset lets its traffic through.
   bool IsEnabled() const;

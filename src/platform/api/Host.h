@@ -68,8 +68,11 @@ struct SystemInfo {
 class Host {
  public:
   virtual ~Host() = default;
+  /// The system's hardware and firmware identity.
   virtual HardwareInfo GetHardwareInfo() const = 0;
+  /// The storage adapters.
   virtual StorageInfo GetStorageInfo() const = 0;
+  /// The hypervisor's identity.
   virtual SystemInfo GetSystemInfo() const = 0;
 };
 

@@ -10,6 +10,7 @@ namespace HostMgr::Lib {
 /// what() gives the library's message.
 class HostMgrException : public std::runtime_error {
  public:
+  /// An exception whose what() is `message`.
   explicit HostMgrException(const std::string& message) : std::runtime_error(message) {}
 };
 

@@ -22,6 +22,7 @@ class HykNicImpl {
  public:
   /// The NIC named `name` (such as "hyk0"). Throws when there is none.
   explicit HykNicImpl(const std::string& name);
+  /// Copies share the snapshot until one of them refreshes.
   ~HykNicImpl();
   HykNicImpl(const HykNicImpl&);
   HykNicImpl& operator=(const HykNicImpl&);

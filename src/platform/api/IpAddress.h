@@ -32,6 +32,7 @@ class IpAddress {
 
   /// 0 for IPv4, 1 for IPv6.
   int GetKind() const { return kind_; }
+  /// GetKind() is kIpv4 or kIpv6.
   bool IsIpv4() const { return kind_ == kIpv4; }
   bool IsIpv6() const { return kind_ == kIpv6; }
   /// Dotted quad for IPv4 ("0.0.0.0" for the empty address); the
@@ -58,6 +59,7 @@ class IpAddress {
 /// An IPv4 address; the default value 0.0.0.0 stands for "no address".
 class Ipv4Address : public IpAddress {
  public:
+  /// 0.0.0.0.
   Ipv4Address() : IpAddress(kIpv4) {}
   /// From the address as a number in host byte order (10.0.0.1 is
   /// 0x0A000001).
@@ -82,7 +84,9 @@ class Ipv4Address : public IpAddress {
 /// The default value :: stands for "no address".
 class Ipv6Address : public IpAddress {
  public:
+  /// ::, without zone.
   Ipv6Address() : IpAddress(kIpv6) {}
+  /// From the sixteen address bytes, without zone.
   explicit Ipv6Address(const std::array<std::uint8_t, 16>& bytes);
   /// Parses any textual IPv6 form, with an optional "%zone" suffix.
   /// Throws HostMgr::Lib::HostMgrException when IsValidAddress(text) is
@@ -97,7 +101,7 @@ class Ipv6Address : public IpAddress {
   const std::array<std::uint8_t, 16>& GetBytes() const { return bytes_; }
   /// The first ten bits are those of fe80::/10.
   bool IsLinkLocal() const;
-  /// The zone (interface name), empty when none.
+  /// The zone (interface name), empty when none; SetZone replaces it.
   const std::string& GetZone() const { return zone_; }
   void SetZone(std::string zone) { zone_ = std::move(zone); }
   /// GetStringAddress with "%zone" appended when a zone is set.

@@ -32,11 +32,12 @@ class IpConfig {
   void SetDhcp(bool dhcp);
   /// Neither none nor DHCP.
   bool IsIpv4Static() const { return !ipv4None_ && !dhcp_; }
+  /// The IPv4 address, netmask and gateway (0.0.0.0 when none). The
+  /// setters change the static values.
   const Ipv4Address& GetIpv4Address() const { return ipv4Address_; }
   void SetIpv4Address(const Ipv4Address& address) { ipv4Address_ = address; }
   const Ipv4Address& GetIpv4Netmask() const { return ipv4Netmask_; }
   void SetIpv4Netmask(const Ipv4Address& netmask) { ipv4Netmask_ = netmask; }
-  /// The NIC's IPv4 gateway; 0.0.0.0 when none.
   const Ipv4Address& GetIpv4Gateway() const { return ipv4Gateway_; }
   void SetIpv4Gateway(const Ipv4Address& gateway) { ipv4Gateway_ = gateway; }
 
@@ -69,6 +70,7 @@ class IpConfig {
   bool GetDnsFromDhcp() const { return dnsFromDhcp_; }
   void SetDnsFromDhcp(bool fromDhcp) { dnsFromDhcp_ = fromDhcp; }
 
+  /// Every field equal (the console's "changed" test).
   bool operator==(const IpConfig& other) const = default;
 
  private:

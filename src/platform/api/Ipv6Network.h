@@ -28,7 +28,9 @@ class Ipv6Network {
   static constexpr int kScopeSiteLocal = 2;
   static constexpr int kScopeGlobal = 3;
 
+  /// ::/64, static, global.
   Ipv6Network() = default;
+  /// The given address, prefix length, type and scope.
   Ipv6Network(Ipv6Address address, int prefixLength, int type = kTypeStatic,
               int scope = kScopeGlobal);
 
@@ -40,6 +42,7 @@ class Ipv6Network {
   /// prefix length from 1 to 128.
   static bool IsValidAddressAndNetmask(std::string_view text);
 
+  /// Accessors of the four parts.
   const Ipv6Address& GetAddress() const { return address_; }
   void SetAddress(const Ipv6Address& address) { address_ = address; }
   int GetPrefixLength() const { return prefixLength_; }
@@ -54,6 +57,7 @@ class Ipv6Network {
   /// "address/prefix".
   std::string ToString() const;
 
+  /// All four parts equal.
   bool operator==(const Ipv6Network& other) const;
 
  private:

@@ -15,6 +15,7 @@ class MacAddress {
 
   /// The all-zero address 00:00:00:00:00:00.
   MacAddress() = default;
+  /// From the six address bytes.
   explicit MacAddress(const Bytes& bytes) : bytes_(bytes) {}
 
   /// Parses six hexadecimal pairs separated by ':' or '-' (either case).
@@ -30,6 +31,7 @@ class MacAddress {
   /// True for 00:00:00:00:00:00.
   bool IsZero() const;
 
+  /// Same six bytes.
   bool operator==(const MacAddress& other) const = default;
 
  private:

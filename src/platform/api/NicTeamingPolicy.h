@@ -13,7 +13,9 @@ namespace HostMgr::Network {
 /// change it, and hand it back with their SetTeamingPolicy.
 class NicTeamingPolicy {
  public:
+  /// No uplinks, none active.
   NicTeamingPolicy() = default;
+  /// The given order and maximum.
   NicTeamingPolicy(std::vector<std::string> uplinkOrder, int maxActiveUplinks)
       : uplinkOrder_(std::move(uplinkOrder)), maxActiveUplinks_(maxActiveUplinks) {}
 
@@ -29,6 +31,7 @@ class NicTeamingPolicy {
   /// The names after the active ones.
   std::vector<std::string> GetStandbyUplinks() const;
 
+  /// Same order and maximum.
   bool operator==(const NicTeamingPolicy& other) const = default;
 
  private:

@@ -28,6 +28,7 @@ class PnicImpl {
  public:
   /// The physical NIC named `name`. Throws when there is none.
   explicit PnicImpl(const std::string& name);
+  /// Copies share the snapshot until one of them refreshes.
   ~PnicImpl();
   PnicImpl(const PnicImpl&);
   PnicImpl& operator=(const PnicImpl&);
@@ -39,6 +40,7 @@ class PnicImpl {
   /// Takes a new snapshot.
   void Refresh();
 
+  /// The NIC's name, such as "hynic0".
   std::string GetName() const;
   /// The PCI device.
   PciDevice GetPciDevice() const;

@@ -18,6 +18,7 @@ class PortGroupImpl {
   /// Whether a portgroup named `name` exists.
   static bool IsValidPortGroup(const std::string& name);
 
+  /// The portgroup's name.
   const std::string& GetName() const { return name_; }
   /// The standard switch holding the portgroup.
   std::string GetVirtualSwitchName() const;

@@ -27,16 +27,19 @@ class PortsetImpl {
   /// Whether a virtual switch (of either kind) named `name` exists.
   static bool IsValidVirtualSwitch(const std::string& name);
 
+  /// The switch's name.
   const std::string& GetName() const { return name_; }
   /// kStandard or kDistributed.
   int GetType() const;
+  /// GetType() is kDistributed.
   bool IsDistributed() const { return GetType() == kDistributed; }
 
   /// Physical NIC names used as uplinks, in the host's order.
   std::vector<std::string> GetUplinks() const;
   /// Portgroup names (standard switch) or port names in use (distributed).
   std::vector<std::string> GetPortGroups() const;
-  /// The switch's port counts.
+  /// The switch's port counts: its size, the ports in use (uplinks,
+  /// kernel NICs, virtual machine ports) and the configured size.
   std::int64_t GetNumPorts() const;
   std::int64_t GetUsedPorts() const;
   std::int64_t GetConfiguredPorts() const;

@@ -12,6 +12,7 @@ namespace HykCtl::Network {
 /// for a stack the host does not have).
 class RoutingInfoImpl {
  public:
+  /// The routes of the TCP/IP stack `stack`.
   explicit RoutingInfoImpl(std::string stack = "defaultTcpipStack");
 
   /// The IPv4 default gateway; 0.0.0.0 when none.
