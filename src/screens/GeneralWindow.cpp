@@ -145,7 +145,8 @@ void GeneralWindow::ShowDescription() {
       footer = kLockdownFooter;
       break;
     case kEntryManagementNetwork:
-      text = FormatManagementNetworkView(ReadManagementNetworkView(), *Strings());
+      text = FormatManagementNetworkView(ReadManagementNetworkView(), *Strings(),
+                                         Description().Width());
       footer = kMoreFooter;
       break;
     case kEntryRestartNetwork:

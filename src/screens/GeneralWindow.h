@@ -53,10 +53,11 @@
 /// - Entry 7 shows each setting as a light-grey label line with its value
 ///   on the next line, indented by two blanks, in white: "Hostname",
 ///   "IPv4 Address" ("Not set" for 0.0.0.0), the DHCP line when the
-///   address came from DHCP, "IPv6 Addresses" with one "address/prefix"
-///   line each (only when the management NIC has any), then an empty line
-///   and the description. Without a management NIC only the description
-///   is shown.
+///   address came from DHCP (unindented, in the label colour), "IPv6
+///   Addresses" with one "address/prefix" line each (only when the
+///   management NIC has any), then an empty line and the description. A
+///   value too long for the indent starts at the left edge. Without a
+///   management NIC only the description is shown.
 /// - Entry 8's footer offers "<Enter> Restart", entry 10's "<Enter> More"
 ///   (it opens a window, like entries 7 and 13); entry 11's footer shows
 ///   the page hints "<Page Up> <Page Down>" in light grey on the left.

@@ -38,18 +38,22 @@ ManagementNetworkView ReadManagementNetworkView() {
   return view;
 }
 
-std::string FormatManagementNetworkView(const ManagementNetworkView& view, StringFactory& strings) {
+std::string FormatManagementNetworkView(const ManagementNetworkView& view, StringFactory& strings,
+                                        int width) {
   const std::string description = strings.GetString(25);
   if (!view.found) {
     return description;
   }
   auto label = [&](std::uint32_t id) { return std::string(strings.GetString(id)) + ":\n"; };
-  auto value = [](const std::string& text) { return "  {color:white}" + text + "{/color}\n"; };
+  auto value = [width](const std::string& text) {
+    const bool fits = static_cast<int>(text.size()) + 2 <= width;
+    return std::string(fits ? "  " : "") + "{color:white}" + text + "{/color}\n";
+  };
   std::string text = label(42) + value(view.hostname) + "\n";
   text +=
       label(37) + value(view.ipv4Address == "0.0.0.0" ? strings.GetString(120) : view.ipv4Address);
   if (view.dhcp) {
-    text += "  " + std::string(strings.GetString(33)) + "\n";
+    text += std::string(strings.GetString(33)) + "\n";
   }
   if (!view.ipv6Addresses.empty()) {
     text += "\n" + label(38);

@@ -249,6 +249,7 @@ TEST(MenuScreenTest, ReloadSignalReadsTheHostAgainAndKeepsTheSelection) {
 
   EXPECT_TRUE(MenuTest::WaitUntil(
       console, [&] { return console.At(lockdownRow, 3).fg == kDarkGrey; }, "greyed lockdown"));
+  console.WaitQuiet();
   EXPECT_EQ(console.At(RowOf(console, "Test Management Network"), 3).fg, kDarkGrey);
   EXPECT_EQ(RightTitle(console), "View System Logs");
   console.Key("Up");
