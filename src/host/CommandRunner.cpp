@@ -142,7 +142,8 @@ std::string ResolveProgram(const std::string& program) {
   if (program.find('/') != std::string::npos) {
     return program;
   }
-  std::string_view search = ProgramSearchPath();
+  const std::string searchPath = ProgramSearchPath();
+  std::string_view search = searchPath;
   while (!search.empty()) {
     std::size_t colon = search.find(':');
     std::string_view folder = search.substr(0, colon);

@@ -72,7 +72,10 @@ int RunCommand(const std::string& program, const std::vector<std::string>& argum
                const std::vector<std::string>* environment = nullptr) noexcept;
 
 /// Runs "/bin/sh" with "sh", "-c" and `commandLine`: nothing captured, no
-/// input, no timeout. Returns the exit code.
+/// input, no timeout. Returns the exit code. The shell resolves the paths
+/// inside the line itself: name programs without a folder (found through
+/// the confined PATH) or put host paths through HostPath() when building
+/// the line.
 int RunShellCommand(const std::string& commandLine) noexcept;
 
 /// Runs `program` capturing up to 255 bytes each of output and error, then
