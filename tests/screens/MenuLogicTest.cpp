@@ -1,5 +1,5 @@
-// Pure logic of the System Customization menu: entry rows, log choice by
-// digit, support pages, tool output parsing, environment override.
+// Pure logic of the System Customization menu: log choice by digit and the
+// log list, support pages, tool output parsing, environment override.
 
 #include <gtest/gtest.h>
 
@@ -8,55 +8,11 @@
 
 #include "screens/EnvironmentOverride.h"
 #include "screens/LogTable.h"
-#include "screens/MenuEntries.h"
-#include "screens/ShellQuote.h"
 #include "screens/SupportPages.h"
 #include "screens/SupportValues.h"
 
 namespace Tulk {
 namespace {
-
-std::vector<std::uint32_t> Ids(const std::vector<MenuEntry>& entries) {
-  std::vector<std::uint32_t> ids;
-  for (const MenuEntry& entry : entries) {
-    ids.push_back(entry.id);
-  }
-  return ids;
-}
-
-TEST(MenuEntriesTest, KeyboardRowOnlyOnLocalConsole) {
-  const MenuHostState host{false, true, true, false};
-  EXPECT_EQ(Ids(BuildMenuEntries(host, true)),
-            (std::vector<std::uint32_t>{5, 6, 3, 7, 8, 9, 10, 3, 15, 13, 3, 12, 3, 11, 3, 14}));
-  EXPECT_EQ(Ids(BuildMenuEntries(host, false)),
-            (std::vector<std::uint32_t>{5, 6, 3, 7, 8, 9, 10, 3, 13, 3, 12, 3, 11, 3, 14}));
-}
-
-TEST(MenuEntriesTest, EnablingRules) {
-  struct Case {
-    MenuHostState host;
-    bool lockdown;
-    bool network;
-    bool reset;
-  };
-  const Case cases[] = {
-      {{true, false, true, false}, true, true, true},    // enabled: possible not asked
-      {{false, true, false, false}, true, false, true},  // possible, no management NIC
-      {{false, false, true, true}, false, true, false},  // neither; network boot
-  };
-  for (const Case& c : cases) {
-    std::map<std::uint32_t, bool> enabled;
-    for (const MenuEntry& entry : BuildMenuEntries(c.host, false)) {
-      enabled[entry.id] = entry.enabled;
-    }
-    EXPECT_EQ(enabled[6], c.lockdown);
-    EXPECT_EQ(enabled[7] && enabled[8] && enabled[9], c.network);
-    EXPECT_EQ(enabled[7] || enabled[8] || enabled[9], c.network);
-    EXPECT_EQ(enabled[14], c.reset);
-    EXPECT_FALSE(enabled[3]);
-  }
-  EXPECT_EQ(EntryLabel("Reset", false), "{color:dark-grey}Reset{/color}");
-}
 
 TEST(LogTableTest, DigitChoosesRow) {
   using Flags = std::array<bool, LogTable::kRows>;
@@ -126,11 +82,6 @@ TEST(EnvironmentOverrideTest, UnsetVariableComesBackSetAndEmpty) {
   setenv("TULK_TEST_OVERRIDE", "kept", 1);
   { EnvironmentOverride secure("TULK_TEST_OVERRIDE", "1"); }
   EXPECT_STREQ(std::getenv("TULK_TEST_OVERRIDE"), "kept");
-}
-
-TEST(ShellQuoteTest, PlainPathsStayAsTheyAre) {
-  EXPECT_EQ(ShellQuote("/sbin/firmwareConfig.py"), "/sbin/firmwareConfig.py");
-  EXPECT_EQ(ShellQuote("/tmp/a b/it's"), "'/tmp/a b/it'\\''s'");
 }
 
 }  // namespace
