@@ -100,27 +100,4 @@ TEST(LayoutTest, WithoutVariableLookupNoTagIsAVariable) {
   EXPECT_EQ(Tulk::LayOutMarkup("{host}x", 10, {}), "{host}x");
 }
 
-TEST(LayoutTest, NoLineIsWiderThanTheWindow) {
-  const std::string text =
-      "{align:right}{color:black}<Enter>{/color} {color:dark-grey}OK{/color}  "
-      "{color:black}<Esc>{/color} {color:dark-grey}Cancel{/color}{/align} Restarting the "
-      "management network will result in a brief network outage. {align:center}centre "
-      "of it all{/align}{align:padding:12}a field too wide{/align}end";
-  for (int width = 1; width <= 60; ++width) {
-    std::string out = Tulk::LayOutMarkup(text, width, {});
-    std::size_t visible = 0;
-    bool inTag = false;
-    for (char c : out) {
-      if (c == '{') {
-        inTag = true;
-      } else if (c == '}') {
-        inTag = false;
-      } else if (!inTag) {
-        visible = c == '\n' ? 0 : visible + 1;
-        ASSERT_LE(visible, static_cast<std::size_t>(width)) << "width " << width << ":\n" << out;
-      }
-    }
-  }
-}
-
 }  // namespace

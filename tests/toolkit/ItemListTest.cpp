@@ -115,13 +115,6 @@ TEST_F(ItemListTest, ExactlyAsManyItemsAsRowsShowsNoBar) {
   }
 }
 
-TEST_F(ItemListTest, BarBlockFollowsTheTopInWholePercent) {
-  EXPECT_EQ(ScrollBar::BlockRowFor(0, 10, 4), 0);
-  EXPECT_EQ(ScrollBar::BlockRowFor(3, 10, 4), 1);  // 50 %
-  EXPECT_EQ(ScrollBar::BlockRowFor(6, 10, 4), 3);
-  EXPECT_EQ(ScrollBar::BlockRowFor(1, 100, 4), 0);  // 1 % of 3 rows
-}
-
 TEST_F(ItemListTest, CurrentRowIsWhiteOnBlackOthersShowTheirItemColours) {
   Build(4, 3);
   items_[2]->SetEnabled(false);
