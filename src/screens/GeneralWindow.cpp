@@ -52,18 +52,17 @@ constexpr char kSupportFooter[] =
 constexpr char kLogOutFooter[] =
     "{align:right}{color:white}<Esc>{/color}{color:light-grey} Log Out{/color}{/align}";
 
+// Frames opened from the menu live on the stack, so that the idle timeout
+// unwinding through them deletes them too.
 void ShowMessage(Frame* owner, std::uint32_t titleId, std::uint32_t textId) {
-  auto* message = new MessageDialog(owner, titleId, owner->Text(textId));
-  RunFrame(message);
-  delete message;
+  MessageDialog message(owner, titleId, owner->Text(textId));
+  RunFrame(&message);
 }
 
 template <typename DialogType>
 int RunDialog(Frame* owner) {
-  auto* dialog = new DialogType(owner);
-  const int result = RunFrame(dialog);
-  delete dialog;
-  return result;
+  DialogType dialog(owner);
+  return RunFrame(&dialog);
 }
 
 }  // namespace
@@ -251,9 +250,8 @@ void GeneralWindow::OpenLog(int digit) {
 bool GeneralWindow::OpenSelected() {
   switch (SelectedId()) {
     case kEntryPassword: {
-      auto* dialog = new ChangePasswordDialog(this, currentUser);
-      RunFrame(dialog);
-      delete dialog;
+      ChangePasswordDialog dialog(this, currentUser);
+      RunFrame(&dialog);
       return true;
     }
     case kEntryLockdown:

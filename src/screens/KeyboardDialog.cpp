@@ -69,9 +69,8 @@ void KeyboardDialog::Select(std::size_t index) {
 
 int KeyboardDialog::Fail(const std::string& logLine) {
   Log(LOG_ERR, "%s", logLine.c_str());
-  auto* message = new MessageDialog(this, 276, Text(280));
-  RunFrame(message);
-  delete message;
+  MessageDialog message(this, 276, Text(280));
+  RunFrame(&message);
   return 0;
 }
 

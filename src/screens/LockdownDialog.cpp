@@ -56,9 +56,8 @@ int LockdownDialog::Run() {
   if (Ticked() != wasEnabled_) {
     const char* command = Ticked() ? "osksvc/auth/lockdown_enter" : "osksvc/auth/lockdown_exit";
     if (RunOskCommand(command) != 0) {
-      auto* message = new MessageDialog(this, 276, Text(280));
-      RunFrame(message);
-      delete message;
+      MessageDialog message(this, 276, Text(280));
+      RunFrame(&message);
     }
   }
   return 1;

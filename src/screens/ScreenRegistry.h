@@ -6,10 +6,8 @@
 /// Each folder registers an opener at start-up; the menu calls it on Enter:
 ///
 ///   ScreenRegistry::Register(ScreenId::ManagementNetwork, [](Frame* owner) {
-///     auto* window = new NetworkWindow(owner);
-///     int result = RunFrame(window);
-///     delete window;
-///     return result;
+///     NetworkWindow window(owner);  // on the stack: the idle timeout
+///     return RunFrame(&window);     // unwinds through the opener
 ///   });
 ///
 /// An entry whose screen has no opener yet does nothing on Enter beyond

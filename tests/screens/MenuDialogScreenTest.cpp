@@ -168,3 +168,19 @@ TEST(MenuDialogScreenTest, SuccessfulResetRestartsOnEnterAndWaitsWithoutCpu) {
 }
 
 }  // namespace
+
+namespace {
+
+TEST(MenuDialogScreenTest, IdleTimeoutLeavesTheMenuFromAnOpenDialog) {
+  Json host = DemoHostState();
+  host["advancedOptions"]["/UserVars/TulkTimeOut"] = 60;
+  TulkTest::Options options = DriverOptions(host);
+  options.timeScale = 30;  // the session ends 2 s after the last key
+  TestConsole console(options);
+  ASSERT_TRUE(SelectEntry(console, "Configure Lockdown Mode"));
+  console.Key("Enter");
+  ASSERT_TRUE(console.WaitForText("Enable lockdown mode"));
+  EXPECT_TRUE(console.WaitForText("result: -1", 6s));
+}
+
+}  // namespace
