@@ -16,6 +16,7 @@ namespace Tulk {
 
 class en_US_Factory final : public StringFactory {
  public:
+  /// Use GetStringFactory("en_US"); there is one catalogue per process.
   en_US_Factory() = default;
   ~en_US_Factory() = default;
   en_US_Factory(const en_US_Factory&) = delete;
@@ -24,6 +25,7 @@ class en_US_Factory final : public StringFactory {
   /// The highest text number; higher numbers give the empty text.
   static constexpr std::uint32_t kLastId = 291;
 
+  /// Text `id`; 2 is the version line, above kLastId the empty text.
   const char* GetString(std::uint32_t id) override;
 
  private:

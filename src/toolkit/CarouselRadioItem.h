@@ -43,6 +43,7 @@ class CarouselRadioItem : public LabelItem {
     current_ = 0;
     Relabel();
   }
+  /// The entries, in the order they are stepped through.
   const std::vector<InfoT>& Entries() const { return entries_; }
 
   /// Makes entry `index` current (ignored when out of range).
@@ -52,6 +53,7 @@ class CarouselRadioItem : public LabelItem {
       Relabel();
     }
   }
+  /// Index of the current entry (0 without entries).
   std::size_t CurrentIndex() const { return current_; }
   /// The current entry, or null without entries.
   const InfoT* Current() const { return entries_.empty() ? nullptr : &entries_[current_]; }

@@ -65,10 +65,14 @@ class Dialog : public Frame {
   void SetText(std::string_view text);
   void SetFooter(std::string_view text);
 
+  /// The title strip (dark grey).
   Window* Header() const { return header_; }
+  /// The body below the header (yellow).
   Window* Body() const { return body_; }
   /// The client area; null when the body is too low for one.
   Window* Content() const { return content_; }
+  /// The text areas of the title, the header's message and the footer;
+  /// each may be null when its height would be below 1.
   TextArea* TitleArea() const { return title_; }
   TextArea* HeaderText() const { return text_; }
   TextArea* FooterArea() const { return footer_; }

@@ -29,7 +29,9 @@ class Frame : public Window, public RuntimeFrame {
   /// 0 cancelled).
   virtual int Run() = 0;
 
+  /// The frame shown before this one (null for the welcome screen).
   Frame* Owner() const { return owner_; }
+  /// The "en_US" string catalogue.
   StringFactory* Strings() const { return strings_; }
   /// Catalogue text `id` (the empty text for an unknown number).
   const char* Text(std::uint32_t id) const;

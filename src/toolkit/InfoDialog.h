@@ -21,12 +21,15 @@ class InfoDialog : public Dialog {
   static constexpr int kHeight = 15;
   static constexpr int kHeaderHeight = 5;
 
+  /// The details dialog above `owner`: `title`, the one-line `message`,
+  /// the `details` text and the `footer` (markup each).
   InfoDialog(Frame* owner, const std::string& details, const std::string& title,
              const std::string& message, const std::string& footer);
 
   /// Waits for Enter; returns 1.
   int Run() override;
 
+  /// The text area of the details (null if the dialog did not fit).
   TextArea* Details() const { return details_; }
 
  private:

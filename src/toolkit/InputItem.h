@@ -20,6 +20,8 @@ namespace Tulk {
 
 class InputItem : public Item {
  public:
+  /// A field with `label` and `value`, `width` columns wide (-1: half the
+  /// row minus 1); pristine, cursor at the end.
   InputItem(std::string label, std::string value, int width);
 
   /// Applies an editing key; the dialog redraws the list afterwards.
@@ -27,15 +29,22 @@ class InputItem : public Item {
 
   /// Assigns the value: pristine again, cursor at the end.
   void SetValue(std::string value);
+  /// The value as edited.
   const std::string& Value() const { return field_.value; }
+  /// The label left of the field (plain text).
   void SetLabel(std::string label) { label_ = std::move(label); }
   const std::string& Label() const { return label_; }
   /// Shows the value as asterisks (passwords).
   void SetMasked(bool masked) { masked_ = masked; }
+  /// Whether the value shows as asterisks.
   bool Masked() const { return masked_; }
+  /// The field width as given (-1: half the row minus 1).
   int Width() const { return width_; }
+  /// The editing state: value, cursor, scroll offset, pristine.
   const InputField& Field() const { return field_; }
 
+  /// Shows the row (InputField::FormatRow) and moves the terminal cursor
+  /// into the field.
   void Draw(TextArea& area) override;
 
  protected:

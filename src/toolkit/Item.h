@@ -31,8 +31,10 @@ class Item {
   /// Enables or disables the item; a disabled item cannot become current
   /// and is drawn dark grey instead of black.
   void SetEnabled(bool enabled);
+  /// Makes the item take part in the list's order, or a plain row.
   void SetFocusable(bool focusable) { focusable_ = focusable; }
 
+  /// Flags: takes part in the order, is the current item, can be chosen.
   bool Focusable() const { return focusable_; }
   bool Focused() const { return focused_; }
   bool Enabled() const { return enabled_; }
@@ -40,6 +42,7 @@ class Item {
   /// black at construction).
   int Background() const { return background_; }
   int Foreground() const { return foreground_; }
+  /// Overrides the row colours (SetEnabled() sets the foreground again).
   void SetBackground(int background) { background_ = background; }
   void SetForeground(int foreground) { foreground_ = foreground; }
 

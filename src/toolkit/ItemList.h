@@ -41,6 +41,7 @@ class ItemList : public Window {
   /// row as it was; a sequence without such an item has no current item.
   /// Does not draw.
   void SetItems(std::vector<Item*> items);
+  /// The items as given to SetItems().
   const std::vector<Item*>& Items() const { return items_; }
 
   /// Makes the n-th focusable item (from 0) current, scrolling it into
@@ -65,15 +66,18 @@ class ItemList : public Window {
   Item* Current() const;
   /// Index of the current item in Items(), or -1.
   int CurrentIndex() const;
+  /// The count of focusable items before the current one.
   int Ordinal() const { return ordinal_; }
   /// Index of the first shown item.
   int Top() const { return top_; }
   /// Row of the current item relative to Top(), or -1 when there is none.
   int CursorRow() const { return cursorRow_; }
+  /// The number of rows (the list's height).
   int Rows() const { return static_cast<int>(rows_.size()); }
   /// The text area of row `row` (for tests and for screens that need the
   /// row's position).
   TextArea* RowArea(int row) const;
+  /// The scroll bar.
   const ScrollBar* Bar() const { return scrollBar_; }
 
  private:

@@ -16,7 +16,9 @@ class LabelItem : public Item {
   /// Replaces the row's text with the label and draws it.
   void Draw(TextArea& area) override;
 
+  /// Replaces the label (markup); shown at the next draw.
   void SetText(std::string label) { label_ = std::move(label); }
+  /// The label (markup).
   const std::string& Label() const { return label_; }
 
  private:

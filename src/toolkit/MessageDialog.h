@@ -18,6 +18,7 @@ namespace Tulk {
 
 class MessageDialog : public Dialog {
  public:
+  /// A message dialog above `owner` titled with catalogue text `titleId`.
   MessageDialog(Frame* owner, std::uint32_t titleId, std::string message, int width = 60,
                 int height = 11, int headerHeight = 7);
 
@@ -25,6 +26,7 @@ class MessageDialog : public Dialog {
   /// Enter; returns 1.
   int Run() override;
 
+  /// The title's catalogue number and the message.
   std::uint32_t TitleId() const { return titleId_; }
   const std::string& Message() const { return message_; }
 

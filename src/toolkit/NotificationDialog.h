@@ -12,6 +12,7 @@ namespace Tulk {
 
 class NotificationDialog : public Dialog {
  public:
+  /// A notification dialog above `owner` with its own `title`.
   NotificationDialog(Frame* owner, std::string title, std::string message, int width = 60,
                      int height = 11, int headerHeight = 7);
 
@@ -19,6 +20,7 @@ class NotificationDialog : public Dialog {
   /// Enter; returns 1.
   int Run() override;
 
+  /// The title and the message.
   const std::string& Title() const { return title_; }
   const std::string& Message() const { return message_; }
 

@@ -52,13 +52,18 @@ class RootWindow : public Frame {
   /// centred on the status line, calls Populate() and refreshes.
   void Show();
 
+  /// Fill the titles above the two halves and the footers below them
+  /// (markup).
   void SetLeftTitle(std::string_view text);
   void SetRightTitle(std::string_view text);
   void SetLeftFooter(std::string_view text);
   void SetRightFooter(std::string_view text);
 
+  /// The menu on the left half.
   ItemList& Menu() const { return *menu_; }
+  /// The description of the selected entry on the right half.
   TextArea& Description() const { return *description_; }
+  /// The parts of the window (see the table above).
   Window* MainArea() const { return mainArea_; }
   Window* StatusLine() const { return statusLine_; }
   Window* LeftPane() const { return leftPane_; }

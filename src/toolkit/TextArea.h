@@ -31,6 +31,7 @@ class TextArea : public Window {
   /// Adds `text` to the end of the current text and draws it (progress
   /// lines).
   void Append(std::string_view text);
+  /// The text as set (markup).
   const std::string& Text() const { return text_; }
 
  protected:

@@ -102,14 +102,19 @@ class Window {
   /// Whether the terminal cursor is currently shown.
   static bool CursorVisible();
 
+  /// The curses window (null when the window has no cells).
   WINDOW* Curses() const { return window_; }
+  /// The parent (null for a top-level window) and the children in
+  /// creation order.
   Window* Parent() const { return parent_; }
   const std::vector<Window*>& Children() const { return children_; }
   /// Screen column and row of the top-left corner.
   int Column() const { return column_; }
   int Row() const { return row_; }
+  /// Size in cells.
   int Width() const { return width_; }
   int Height() const { return height_; }
+  /// The window's own colours.
   int Background() const { return background_; }
   int Foreground() const { return foreground_; }
   /// The window was last drawn active.
