@@ -1,7 +1,9 @@
 #include "screens/PamAuthenticator.h"
 
 #include <security/pam_appl.h>
+#include <unistd.h>
 
+#include "runtime/HostPath.h"
 #include "screens/PamConversation.h"
 
 namespace Tulk {
@@ -9,6 +11,18 @@ namespace {
 
 bool Passed(int status) {
   return status == PAM_SUCCESS || status == PAM_NEW_AUTHTOK_REQD;
+}
+
+int Start(const std::string& service, const std::string& user, const PamConversation& conversation,
+          pam_handle_t** handle) {
+  if (HostRootConfined()) {
+    const std::string folder = HostPath("/etc/pam.d");
+    if (access((folder + "/" + service).c_str(), F_OK) == 0) {
+      return pam_start_confdir(service.c_str(), user.c_str(), conversation.Get(), folder.c_str(),
+                               handle);
+    }
+  }
+  return pam_start(service.c_str(), user.c_str(), conversation.Get(), handle);
 }
 
 }  // namespace
@@ -19,7 +33,7 @@ PamAuthenticator::PamAuthenticator(std::string service) : service_(std::move(ser
 int PamAuthenticator::Authenticate(const std::string& user, const std::string& password) const {
   PamConversation conversation(password);
   pam_handle_t* handle = nullptr;
-  int status = pam_start(service_.c_str(), user.c_str(), conversation.Get(), &handle);
+  int status = Start(service_, user, conversation, &handle);
   if (status != PAM_SUCCESS) {
     return status;
   }
@@ -35,7 +49,7 @@ int PamAuthenticator::ChangePassword(const std::string& user, const std::string&
                                      const std::string& newPassword) const {
   PamConversation conversation(oldPassword, newPassword);
   pam_handle_t* handle = nullptr;
-  int status = pam_start(service_.c_str(), user.c_str(), conversation.Get(), &handle);
+  int status = Start(service_, user, conversation, &handle);
   if (status != PAM_SUCCESS) {
     return status;
   }

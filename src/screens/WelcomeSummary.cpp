@@ -3,7 +3,7 @@
 #include <algorithm>
 #include <cctype>
 #include <cmath>
-#include <sstream>
+#include <cstdio>
 
 #include "render/StringFactory.h"
 
@@ -66,9 +66,11 @@ std::string WelcomeSummary::MemoryLine(std::uint64_t bytes) {
     divisor *= 1024;
   }
   const float tenths = std::round(static_cast<float>(bytes) * 10.0f / static_cast<float>(divisor));
-  std::ostringstream line;
-  line << tenths / 10.0f << ' ' << kUnits[unit] << "iB Memory";
-  return line.str();
+  // "%g" is the stream's default format for a float: 16, 1.5, 15.9.
+  char line[48];
+  std::snprintf(line, sizeof line, "%g %ciB Memory", static_cast<double>(tenths / 10.0f),
+                kUnits[unit]);
+  return line;
 }
 
 std::string WelcomeSummary::Ipv6Lines(const std::vector<Ipv6Entry>& entries,

@@ -51,6 +51,22 @@ TEST(LoginScreenTest, NamePasswordModeAndEscLeavesNoTrace) {
   EXPECT_FALSE(console.Cursor().visible);
 }
 
+TEST(LoginScreenTest, TypingSendsOnlyTheChangedCells) {
+  TestConsole console(ConsoleOptions());
+  ASSERT_TRUE(Settled(console, "Customize System/View Logs"));
+  console.Key("F2");
+  ASSERT_TRUE(Settled(console, "Login Name:        [ root "));
+  // The first key replaces the pre-filled name, every later one adds a cell;
+  // a serial console shows about 1,000 bytes a second.
+  for (const char* key : {"o", "p", "s"}) {
+    const std::size_t before = console.BytesReceived();
+    console.Type(key);
+    console.WaitQuiet();
+    EXPECT_LT(console.BytesReceived() - before, 40u) << key;
+  }
+  EXPECT_TRUE(console.Contains("Login Name:        [ ops "));
+}
+
 TEST(LoginScreenTest, F3SwitchesBetweenPasswordAndPinMode) {
   TestConsole console(ConsoleOptions());
   ASSERT_TRUE(Settled(console, "Customize System/View Logs"));
@@ -105,9 +121,9 @@ TEST(LoginScreenTest, WrongPasswordIsReportedAndCanBeRetried) {
 }
 
 TEST(LoginScreenTest, PermissionDeniedByTheAccountCheck) {
-  TulkTest::Options options = ConsoleOptions();
-  options.pamPolicy = {"operator:denied"};
-  TestConsole console(options);
+  SessionTest::PamSetup pam;
+  pam.policy = {"operator:denied"};
+  TestConsole console(ConsoleOptions(DemoHostState(), pam));
   ASSERT_TRUE(LogIn(console, "operator", "operator"));
   ASSERT_TRUE(Settled(console, "User does not have permission to login to TULK."));
   EXPECT_EQ(SessionTest::CountLog(console, "<35>Access denied for user operator"), 1);
@@ -122,9 +138,9 @@ TEST(LoginScreenTest, PermissionDeniedByTheAccountCheck) {
 }
 
 TEST(LoginScreenTest, ExpiredPasswordIsChangedThenLoginAgain) {
-  TulkTest::Options options = ConsoleOptions();
-  options.pamPolicy = {"root:expired"};
-  TestConsole console(options);
+  SessionTest::PamSetup pam;
+  pam.policy = {"root:expired"};
+  TestConsole console(ConsoleOptions(DemoHostState(), pam));
   ASSERT_TRUE(LogIn(console));
   ASSERT_TRUE(Settled(console, "Password has expired."));
   EXPECT_TRUE(console.Contains("You will be prompted to set a new password and then"));
@@ -149,7 +165,7 @@ TEST(LoginScreenTest, ExpiredPasswordIsChangedThenLoginAgain) {
   ASSERT_TRUE(Gone(console, "Confirm Password:"));
   ASSERT_TRUE(Settled(console, "Authentication Required"));
   EXPECT_FALSE(console.Contains("System Customization"));
-  EXPECT_NE(ReadFile(console.PamPasswordFile()).find("root:fresh-1:"), std::string::npos);
+  EXPECT_NE(ReadFile(SessionTest::PasswordFile(console)).find("root:fresh-1:"), std::string::npos);
 
   console.Type("fresh-1");
   console.Key("Enter");
@@ -158,9 +174,9 @@ TEST(LoginScreenTest, ExpiredPasswordIsChangedThenLoginAgain) {
 }
 
 TEST(LoginScreenTest, EmptyPasswordMarksThePasswordNotSet) {
-  TulkTest::Options options = ConsoleOptions();
-  options.pamUsers = {{"root", ""}};
-  TestConsole console(options);
+  SessionTest::PamSetup pam;
+  pam.users = {{"root", ""}};
+  TestConsole console(ConsoleOptions(DemoHostState(), pam));
   ASSERT_TRUE(LogIn(console, "root", ""));
   ASSERT_TRUE(Settled(console, "System Customization"));
   EXPECT_TRUE(console.WaitForText("Not set"));
@@ -169,9 +185,9 @@ TEST(LoginScreenTest, EmptyPasswordMarksThePasswordNotSet) {
 TEST(LoginScreenTest, SmartCardLoginAndRemoval) {
   json host = DemoHostState();
   host["smartCards"] = json::array({{{"userId", "cardholder"}, {"valid", true}}});
-  TulkTest::Options options = ConsoleOptions(host);
-  options.pamUsers["cardholder"] = "2468";
-  TestConsole console(options);
+  SessionTest::PamSetup pam;
+  pam.users["cardholder"] = "2468";
+  TestConsole console(ConsoleOptions(host, pam));
   ASSERT_TRUE(Settled(console, "Customize System/View Logs"));
   console.Key("F2");
   ASSERT_TRUE(Settled(console, "Enter the smart card login PIN for"));

@@ -22,7 +22,7 @@ using TulkTest::TestConsole;
 constexpr char kDialogText[] = "Setting the password will prevent unauthorized access";
 
 std::string PasswordFile(const TestConsole& console) {
-  std::ifstream in(console.PamPasswordFile());
+  std::ifstream in(SessionTest::PasswordFile(console));
   return std::string(std::istreambuf_iterator<char>(in), {});
 }
 
@@ -138,9 +138,9 @@ TEST(PasswordScreenTest, SamePasswordAsksFirstThenChangesAndReports) {
 }
 
 TEST(PasswordScreenTest, PamRefusingTheChangeIsReported) {
-  TulkTest::Options options = ConsoleOptions();
-  options.pamPolicy = {"root:chauthtok-fails"};
-  TestConsole console(options);
+  SessionTest::PamSetup pam;
+  pam.policy = {"root:chauthtok-fails"};
+  TestConsole console(ConsoleOptions(TulkTest::DemoHostState(), pam));
   ASSERT_TRUE(OpenPasswordDialog(console));
   console.Type(SessionTest::kRootPassword);
   console.Key("Down");

@@ -2,9 +2,17 @@
 // Helpers of the session screens' tests: a console with PAM users and the
 // console-login marker, logging in, and waiting on the simulated host's
 // record files.
+//
+// Logins go through the real PAM library with the root's own configuration
+// ("<root>/etc/pam.d/tulk", which the console reads when it is confined to
+// a root): pam_matrix with a password file in the root, and the test policy
+// module (tests/pam) before it. No library is preloaded, so the same tests
+// run in the sanitizer build.
 
 #include <chrono>
+#include <filesystem>
 #include <functional>
+#include <map>
 #include <string>
 #include <vector>
 
@@ -18,12 +26,24 @@ namespace SessionTest {
 /// The demo users of the test PAM service.
 inline constexpr char kRootPassword[] = "tulk";
 
-/// Options for `host` with the PAM users root/"tulk" and operator/"operator"
-/// and the console-login marker in the root. `prepare`, when given, runs
-/// after the marker is written.
+/// The PAM set-up of a test root.
+struct PamSetup {
+  /// Users and their passwords.
+  std::map<std::string, std::string> users = {{"root", kRootPassword}, {"operator", "operator"}};
+  /// Lines "user:outcome" for the policy module: "expired", "denied",
+  /// "chauthtok-fails".
+  std::vector<std::string> policy;
+};
+
+/// Options for `host` with the PAM set-up `pam` and the console-login
+/// marker in the root. `prepare`, when given, runs afterwards.
 TulkTest::Options ConsoleOptions(
-    const nlohmann::json& host = TulkTest::DemoHostState(),
+    const nlohmann::json& host = TulkTest::DemoHostState(), const PamSetup& pam = {},
     std::function<void(const std::filesystem::path&)> prepare = nullptr);
+
+/// The pam_matrix password file of the console's root ("user:password:
+/// service" lines; a password changed through PAM lands here).
+std::filesystem::path PasswordFile(const TulkTest::TestConsole& console);
 
 /// Waits for the settled welcome screen, opens the login with `key` ("F2"
 /// or "F12"), enters `user` (replacing the

@@ -103,7 +103,7 @@ TEST(ShutdownScreenTest, RestartTerminatesMachinesWhenTicked) {
 
 TEST(ShutdownScreenTest, RestartThatCannotStartReturnsToTheDialog) {
   TulkTest::Options options = ConsoleOptions(
-      TulkTest::DemoHostState(),
+      TulkTest::DemoHostState(), {},
       [](const std::filesystem::path& root) { std::filesystem::remove(root / "bin/sh"); });
   TestConsole console(options);
   ASSERT_TRUE(OpenShutdown(console));

@@ -94,12 +94,14 @@ TEST(WelcomeScreenTest, F4TogglesMonochromeAndOtherKeysRepaint) {
   console.Key("F4");
   ASSERT_TRUE(WaitUntil(
       console, [&] { return console.At(3, 40).reverse; }, "standout panel"));
+  console.WaitQuiet();
   EXPECT_FALSE(console.At(18, 40).reverse);
   EXPECT_NE(console.At(18, 40).bg, Tulk::kYellow);
 
   console.Key("F4");
   ASSERT_TRUE(WaitUntil(
       console, [&] { return console.At(18, 40).bg == Tulk::kYellow; }, "colours"));
+  console.WaitQuiet();
   EXPECT_FALSE(console.At(3, 40).reverse);
 
   const std::size_t before = console.BytesReceived();
