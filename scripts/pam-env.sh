@@ -23,6 +23,9 @@ for service in tulk other; do
     printf '%-8s required %s passdb=%s\n' "$type" "$matrix" "$passdb"
   done > "$services/$service"
 done
+# The console confined to a root reads the root's own PAM configuration.
+mkdir -p "$root/etc/pam.d"
+cp "$services/tulk" "$services/other" "$root/etc/pam.d/"
 
 echo "LD_PRELOAD=$wrapper"
 echo "PAM_WRAPPER=1"

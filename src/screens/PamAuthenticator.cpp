@@ -1,7 +1,6 @@
 #include "screens/PamAuthenticator.h"
 
 #include <security/pam_appl.h>
-#include <unistd.h>
 
 #include "runtime/HostPath.h"
 #include "screens/PamConversation.h"
@@ -17,10 +16,8 @@ int Start(const std::string& service, const std::string& user, const PamConversa
           pam_handle_t** handle) {
   if (HostRootConfined()) {
     const std::string folder = HostPath("/etc/pam.d");
-    if (access((folder + "/" + service).c_str(), F_OK) == 0) {
-      return pam_start_confdir(service.c_str(), user.c_str(), conversation.Get(), folder.c_str(),
-                               handle);
-    }
+    return pam_start_confdir(service.c_str(), user.c_str(), conversation.Get(), folder.c_str(),
+                             handle);
   }
   return pam_start(service.c_str(), user.c_str(), conversation.Get(), handle);
 }

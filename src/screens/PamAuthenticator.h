@@ -8,11 +8,12 @@
 /// which answers the modules' prompts from the texts given here.
 ///
 /// The PAM configuration is host state like any other: when the console is
-/// confined to a root (TULK_ROOT, runtime/HostPath.h) that has its own
-/// "/etc/pam.d/<service>", the transaction reads the root's configuration
-/// (pam_start_confdir, Linux-PAM 1.4 or later), so that a test or demo
-/// root brings its own users and never reads the machine's /etc/pam.d.
-/// Otherwise, and always on a real host, PAM's own configuration is used.
+/// confined to a root (TULK_ROOT, runtime/HostPath.h), every transaction
+/// reads the root's "/etc/pam.d" (pam_start_confdir, Linux-PAM 1.4 or
+/// later), so that a test or demo root brings its own users and modules
+/// and a simulated console can never check or change a password of the
+/// machine it runs on. A root without a configuration for the service
+/// refuses every login. On a real host PAM's own configuration is used.
 ///
 /// Results are PAM status codes (security/pam_appl.h): PAM_SUCCESS (0),
 /// PAM_NEW_AUTHTOK_REQD (12, the password has expired), PAM_PERM_DENIED
