@@ -18,6 +18,9 @@ namespace {
 using TulkTest::Options;
 using TulkTest::TestConsole;
 
+// A text of the welcome screen (its footer), shown once the console runs.
+constexpr char kWelcomeText[] = "Customize System/View Logs";
+
 std::string ReadFile(const std::filesystem::path& path) {
   std::ifstream in(path);
   std::stringstream text;
@@ -37,7 +40,7 @@ bool HasLine(const TestConsole& console, const std::string& line) {
 TEST(Startup, LogsStartAndWritesThePidFile) {
   TestConsole console;
   ASSERT_TRUE(console.WaitForLog("Starting TULK"));
-  ASSERT_TRUE(console.WaitForText("TULK"));
+  ASSERT_TRUE(console.WaitForText(kWelcomeText));
   EXPECT_TRUE(HasLine(console, "<14>Starting TULK"));
   EXPECT_EQ(ReadFile(console.Root() / "var/run/tulk.pid"), std::to_string(console.Pid()));
 }
@@ -49,7 +52,7 @@ TEST(Startup, LivePidFileIsKeptAndTheConsoleStillStarts) {
     std::ofstream(root / "var/run/tulk.pid") << live;
   };
   TestConsole console(options);
-  ASSERT_TRUE(console.WaitForText("TULK"));
+  ASSERT_TRUE(console.WaitForText(kWelcomeText));
   EXPECT_TRUE(HasLine(
       console, "<11>Attempt to run multiple TULK instances, not updating /var/run/tulk.pid"));
   EXPECT_EQ(ReadFile(console.Root() / "var/run/tulk.pid"), live);
@@ -60,7 +63,7 @@ TEST(Startup, InvalidVtIsLoggedAndTheTerminalLeftAlone) {
     Options options;
     options.args = {argument};
     TestConsole console(options);
-    ASSERT_TRUE(console.WaitForText("TULK")) << argument;
+    ASSERT_TRUE(console.WaitForText(kWelcomeText)) << argument;
     EXPECT_TRUE(HasLine(console, std::string("<11>Invalid VT specified for TULK: ") + argument))
         << argument;
     auto attributes = console.TerminalAttributes();
@@ -73,7 +76,7 @@ TEST(Startup, ValidVtDisablesTheSuspendCharacter) {
   Options options;
   options.args = {"7x"};
   TestConsole console(options);
-  ASSERT_TRUE(console.WaitForText("TULK"));
+  ASSERT_TRUE(console.WaitForText(kWelcomeText));
   for (const std::string& line : console.LogLines()) {
     EXPECT_EQ(line.find("Invalid VT"), std::string::npos) << line;
   }
@@ -85,18 +88,18 @@ TEST(Startup, ValidVtDisablesTheSuspendCharacter) {
 TEST(Startup, TerminatingSignalsExitZeroWithTheTerminalRestored) {
   for (int signal : {SIGINT, SIGQUIT, SIGTERM, SIGUSR2}) {
     TestConsole console;
-    ASSERT_TRUE(console.WaitForText("TULK"));
+    ASSERT_TRUE(console.WaitForText(kWelcomeText));
     console.Signal(signal);
     EXPECT_EQ(console.WaitExit(), 0) << "signal " << signal;
     // endwin() ran: the alternate screen is left and the cursor shows again.
-    EXPECT_FALSE(console.Contains("TULK")) << console.Dump();
+    EXPECT_FALSE(console.Contains(kWelcomeText)) << console.Dump();
     EXPECT_TRUE(console.Cursor().visible) << "signal " << signal;
   }
 }
 
 TEST(Startup, ResizeLogsTheNewSizeAndExits) {
   TestConsole console;
-  ASSERT_TRUE(console.WaitForText("TULK"));
+  ASSERT_TRUE(console.WaitForText(kWelcomeText));
   console.Resize(132, 43);
   EXPECT_EQ(console.WaitExit(), 0);
   EXPECT_TRUE(HasLine(console, "<14>Resized window to 132x43"));
@@ -106,18 +109,18 @@ TEST(Startup, TerminalWithoutColourChangeDrawsInStandout) {
   Options options;
   options.term = "vt102";
   TestConsole console(options);
-  ASSERT_TRUE(console.WaitForText("TULK"));
+  ASSERT_TRUE(console.WaitForText(kWelcomeText));
   console.WaitQuiet();
-  TulkTest::Cell cell = console.At(1, 2);
-  EXPECT_EQ(cell.text, "T");
+  TulkTest::Cell cell = console.At(0, 0);
+  EXPECT_EQ(cell.text, "┌");
   EXPECT_TRUE(cell.reverse) << console.Dump();
 }
 
 TEST(Startup, ColourTerminalDrawsWhiteOnBlack) {
   TestConsole console;
-  ASSERT_TRUE(console.WaitForText("TULK"));
+  ASSERT_TRUE(console.WaitForText(kWelcomeText));
   console.WaitQuiet();
-  TulkTest::Cell cell = console.At(1, 2);
+  TulkTest::Cell cell = console.At(0, 0);
   EXPECT_EQ(cell.fg, Tulk::kWhite);
   EXPECT_EQ(cell.bg, Tulk::kBlack);
   EXPECT_FALSE(cell.reverse);
@@ -127,7 +130,7 @@ TEST(Startup, UnsetTermFallsBackToVt102) {
   Options options;
   options.term = "";
   TestConsole console(options);
-  ASSERT_TRUE(console.WaitForText("TULK"));
+  ASSERT_TRUE(console.WaitForText(kWelcomeText));
   console.WaitQuiet();
   EXPECT_TRUE(console.At(1, 2).reverse) << "vt102 cannot change colours: standout expected";
 }
