@@ -56,6 +56,7 @@ class ChangePasswordDialog : public Dialog {
   /// `passwordWasEmpty` from the new password), 0 when left with Esc.
   int Run() override;
 
+  /// The user whose password is changed.
   const std::string& User() const { return user_; }
 
  private:

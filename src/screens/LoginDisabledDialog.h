@@ -15,6 +15,7 @@ namespace Tulk {
 
 class LoginDisabledDialog : public Dialog {
  public:
+  /// Lays the dialog out above `owner` with its texts.
   explicit LoginDisabledDialog(Frame* owner);
 
   /// Waits for Enter (or Esc); returns 0.

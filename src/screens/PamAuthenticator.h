@@ -47,6 +47,7 @@ class PamAuthenticator {
   int ChangePassword(const std::string& user, const std::string& oldPassword,
                      const std::string& newPassword) const;
 
+  /// The PAM service name.
   const std::string& Service() const { return service_; }
 
  private:

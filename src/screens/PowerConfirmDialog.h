@@ -36,6 +36,8 @@ class PowerConfirmDialog : public Dialog {
   bool Graceful() const { return graceful_; }
 
  protected:
+  /// A 70 x 10 dialog with the catalogue texts `titleId` and `messageId`
+  /// that runs `command` through "/bin/sh -c".
   PowerConfirmDialog(Frame* owner, bool graceful, std::uint32_t titleId, std::uint32_t messageId,
                      std::string command);
 
@@ -49,12 +51,16 @@ class PowerConfirmDialog : public Dialog {
 /// "Shut Down Host", "Shutdown in progress...", then "poweroff".
 class ShutdownConfirmDialog : public PowerConfirmDialog {
  public:
+  /// The progress dialog above `owner`; `graceful` is true when running
+  /// machines are not to be terminated.
   ShutdownConfirmDialog(Frame* owner, bool graceful);
 };
 
 /// "Restart Host", "Restart in progress...", then "reboot".
 class RebootConfirmDialog : public PowerConfirmDialog {
  public:
+  /// The progress dialog above `owner`; `graceful` as for
+  /// ShutdownConfirmDialog.
   RebootConfirmDialog(Frame* owner, bool graceful);
 };
 

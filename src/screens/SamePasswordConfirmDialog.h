@@ -12,6 +12,8 @@ namespace Tulk {
 
 class SamePasswordConfirmDialog : public Dialog {
  public:
+  /// Lays the question out above `owner`; the default Dialog key loop
+  /// answers it.
   explicit SamePasswordConfirmDialog(Frame* owner);
 };
 

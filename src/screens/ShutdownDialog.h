@@ -22,6 +22,7 @@ class ItemList;
 
 class ShutdownDialog : public Dialog {
  public:
+  /// Lays the dialog out above `owner`, the check box unticked.
   explicit ShutdownDialog(Frame* owner);
 
   /// The key loop; returns 0 (nothing changed) when left with Esc.

@@ -56,6 +56,7 @@ class WelcomeWindow : public Frame {
  public:
   /// The full-screen frame (COLS x LINES, black and white), no owner.
   WelcomeWindow();
+  /// Deletes the panels or the message area with the frame.
   ~WelcomeWindow() override;
 
   /// The session loop; returns only when the run is to end normally (it

@@ -85,23 +85,53 @@ TEST(LoginScreenTest, F3SwitchesBetweenPasswordAndPinMode) {
   EXPECT_TRUE(console.Contains("Enter an authorized login name and password for"));
 }
 
-TEST(LoginScreenTest, WrongPasswordIsReportedAndCanBeRetried) {
-  TestConsole console(ConsoleOptions());
-  ASSERT_TRUE(LogIn(console, "root", "wrong"));
-  ASSERT_TRUE(Settled(console, "Invalid login or password."));
-  EXPECT_TRUE(console.Contains("Authentication failed"));
-  ASSERT_TRUE(console.WaitForLog("Authentication of user root failed"));
-  EXPECT_EQ(SessionTest::CountLog(console, "<35>Authentication of user root failed"), 1);
+struct FailedLogin {
+  const char* user;
+  const char* password;
+  const char* policy;
+  const char* logLine;  // authentication facility, error level
+  const char* reason;
+  const char* eventText;
+  const char* message;
+};
 
+class FailedLoginTest : public ::testing::TestWithParam<FailedLogin> {};
+
+TEST_P(FailedLoginTest, IsLoggedAuditedPostedAndShown) {
+  const FailedLogin& c = GetParam();
+  SessionTest::PamSetup pam;
+  pam.policy = {c.policy};
+  TestConsole console(ConsoleOptions(DemoHostState(), pam));
+  ASSERT_TRUE(LogIn(console, c.user, c.password));
+  ASSERT_TRUE(Settled(console, c.message));
+  EXPECT_TRUE(console.Contains("Authentication failed"));
+  EXPECT_EQ(SessionTest::CountLog(console, std::string("<35>") + c.logLine), 1);
   const auto audit = RecordsWhere(console, "audit.jsonl", "event", "tulk.login");
   ASSERT_EQ(audit.size(), 1u);
   EXPECT_EQ(audit[0]["result"], "failure");
-  EXPECT_EQ(audit[0]["user"], "root");
-  EXPECT_EQ(audit[0]["attributes"], json({{"reason", "Invalid login"}}));
+  EXPECT_EQ(audit[0]["user"], c.user);
+  EXPECT_EQ(audit[0]["attributes"], json({{"reason", c.reason}}));
   const auto events = RecordsWhere(console, "events.jsonl", "id", "qob.user.tulk.login.failed");
   ASSERT_EQ(events.size(), 1u);
-  EXPECT_EQ(events[0]["text"], "Authentication of user root failed");
+  EXPECT_EQ(events[0]["text"], c.eventText);
+}
 
+INSTANTIATE_TEST_SUITE_P(
+    Outcomes, FailedLoginTest,
+    ::testing::Values(
+        FailedLogin{"root", "wrong", "", "Authentication of user root failed", "Invalid login",
+                    "Authentication of user root failed", "Invalid login or password."},
+        FailedLogin{"operator", "operator", "operator:denied", "Access denied for user operator",
+                    "No permission", "Access denied for user operator",
+                    "User does not have permission to login to TULK."},
+        FailedLogin{"root", "tulk", "root:expired", "Password has expired for user root",
+                    "Password expired", "Access denied for user root",
+                    "You will be prompted to set a new password and then"}));
+
+TEST(LoginScreenTest, FailedLoginKeepsTheNameAndCanBeRetried) {
+  TestConsole console(ConsoleOptions());
+  ASSERT_TRUE(LogIn(console, "root", "wrong"));
+  ASSERT_TRUE(Settled(console, "Invalid login or password."));
   console.Key("Esc");  // only Enter closes the message
   console.WaitQuiet();
   EXPECT_TRUE(console.Contains("Invalid login or password."));
@@ -120,37 +150,12 @@ TEST(LoginScreenTest, WrongPasswordIsReportedAndCanBeRetried) {
   EXPECT_EQ(logins[1]["attributes"], json::object());
 }
 
-TEST(LoginScreenTest, PermissionDeniedByTheAccountCheck) {
-  SessionTest::PamSetup pam;
-  pam.policy = {"operator:denied"};
-  TestConsole console(ConsoleOptions(DemoHostState(), pam));
-  ASSERT_TRUE(LogIn(console, "operator", "operator"));
-  ASSERT_TRUE(Settled(console, "User does not have permission to login to TULK."));
-  EXPECT_EQ(SessionTest::CountLog(console, "<35>Access denied for user operator"), 1);
-  const auto audit = RecordsWhere(console, "audit.jsonl", "event", "tulk.login");
-  ASSERT_EQ(audit.size(), 1u);
-  EXPECT_EQ(audit[0]["attributes"], json({{"reason", "No permission"}}));
-  const auto events = RecordsWhere(console, "events.jsonl", "id", "qob.user.tulk.login.failed");
-  ASSERT_EQ(events.size(), 1u);
-  EXPECT_EQ(events[0]["text"], "Access denied for user operator");
-  console.Key("Enter");
-  ASSERT_TRUE(Settled(console, "Login Name:        [ operator "));
-}
-
 TEST(LoginScreenTest, ExpiredPasswordIsChangedThenLoginAgain) {
   SessionTest::PamSetup pam;
   pam.policy = {"root:expired"};
   TestConsole console(ConsoleOptions(DemoHostState(), pam));
   ASSERT_TRUE(LogIn(console));
   ASSERT_TRUE(Settled(console, "Password has expired."));
-  EXPECT_TRUE(console.Contains("You will be prompted to set a new password and then"));
-  EXPECT_EQ(SessionTest::CountLog(console, "<35>Password has expired for user root"), 1);
-  const auto audit = RecordsWhere(console, "audit.jsonl", "event", "tulk.login");
-  ASSERT_EQ(audit.size(), 1u);
-  EXPECT_EQ(audit[0]["attributes"], json({{"reason", "Password expired"}}));
-  EXPECT_EQ(RecordsWhere(console, "events.jsonl", "text", "Access denied for user root").size(),
-            1u);
-
   console.Key("Enter");
   ASSERT_TRUE(Settled(console, "Setting the password will prevent unauthorized access"));
   console.Type(SessionTest::kRootPassword);

@@ -70,12 +70,5 @@ TEST(PamConversationTest, AnswersEveryPromptOfOneCallAndSkipsMessages) {
   EXPECT_EQ(answers, (std::vector<std::string>{"<none>", "old", "<none>", "new", "new"}));
 }
 
-TEST(PamConversationTest, RefusesAnEmptyCall) {
-  PamConversation conversation("secret");
-  int status = -1;
-  Converse(conversation, {}, &status);
-  EXPECT_EQ(status, PAM_CONV_ERR);
-}
-
 }  // namespace
 }  // namespace Tulk
