@@ -22,6 +22,17 @@ namespace {
 std::uint32_t g_idleTimeoutSeconds = kDefaultTulkTimeOutSeconds;
 std::function<std::optional<std::uint32_t>()> g_idleTimeoutReader;
 std::function<void()> g_smartCardCheck;
+// While assembling an escape sequence curses may read bytes beyond the key
+// it returns; they wait in its own queue, where poll() cannot see them.
+bool g_cursesMayHoldInput = false;
+
+int ReadKeyNow() {
+  nodelay(stdscr, TRUE);
+  int key = wgetch(stdscr);
+  nodelay(stdscr, FALSE);
+  g_cursesMayHoldInput = key != ERR;
+  return key;
+}
 
 bool IsLater(const timeval& a, const timeval& b) {
   return a.tv_sec > b.tv_sec || (a.tv_sec == b.tv_sec && a.tv_usec > b.tv_usec);
@@ -43,6 +54,12 @@ timeval Until(const timeval& now, const timeval& until) {
 }  // namespace
 
 int PollInput(const timeval* limit) {
+  if (g_cursesMayHoldInput) {
+    int key = ReadKeyNow();
+    if (key != ERR) {
+      return key;
+    }
+  }
   pollfd fds[2] = {{0, POLLIN, 0}, {SignalPipeReadFd(), POLLIN, 0}};
   int millis = limit == nullptr ? -1 : Clock::RealMilliseconds(limit->tv_sec, limit->tv_usec);
   int ready = poll(fds, 2, millis);
@@ -54,10 +71,7 @@ int PollInput(const timeval* limit) {
     return kPollTimeLimit;
   }
   if ((fds[0].revents & (POLLIN | POLLHUP | POLLERR)) != 0) {
-    nodelay(stdscr, TRUE);
-    int key = wgetch(stdscr);
-    nodelay(stdscr, FALSE);
-    return key;
+    return ReadKeyNow();
   }
   if ((fds[1].revents & POLLIN) != 0) {
     unsigned char code = 0;

@@ -2,6 +2,9 @@
 
 #include <security/pam_appl.h>
 
+#include <cstdlib>
+#include <cstring>
+
 #include "runtime/HostPath.h"
 #include "screens/PamConversation.h"
 
@@ -12,9 +15,20 @@ bool Passed(int status) {
   return status == PAM_SUCCESS || status == PAM_NEW_AUTHTOK_REQD;
 }
 
+// A console confined to a root never reads the machine's PAM configuration
+// (a simulated host must not check or change a real password): it reads the
+// root's own, unless pam_wrapper is active and names the service folder.
+bool UsesRootConfiguration() {
+  if (!HostRootConfined()) {
+    return false;
+  }
+  const char* wrapped = std::getenv("PAM_WRAPPER");
+  return wrapped == nullptr || std::strcmp(wrapped, "1") != 0;
+}
+
 int Start(const std::string& service, const std::string& user, const PamConversation& conversation,
           pam_handle_t** handle) {
-  if (HostRootConfined()) {
+  if (UsesRootConfiguration()) {
     const std::string folder = HostPath("/etc/pam.d");
     return pam_start_confdir(service.c_str(), user.c_str(), conversation.Get(), folder.c_str(),
                              handle);

@@ -3,12 +3,15 @@
 #include <syslog.h>
 
 #include <cstdio>
+#include <functional>
+#include <memory>
 #include <sstream>
 
 #include "host/CommandRunner.h"
 #include "render/HostValues.h"
 #include "runtime/HostPath.h"
 #include "runtime/SystemLog.h"
+#include "screens/FileValueCache.h"
 
 namespace Tulk {
 namespace {
@@ -80,12 +83,28 @@ std::string HostKeyFingerprint(const std::string& keyPath) {
   return SecondWord(std::string(output, static_cast<std::size_t>(outputLength)));
 }
 
+namespace {
+
+// Registers `key` with a value computed from `path` and kept until that
+// file changes.
+void RegisterFileValue(const char* key, const char* path, std::function<std::string()> compute) {
+  auto cache = std::make_shared<FileValueCache>(HostPath(path), std::move(compute));
+  RegisterValueProvider(key, [cache] { return cache->Get(); });
+}
+
+}  // namespace
+
 void RegisterSupportValueProviders() {
-  RegisterValueProvider("ssl-thumbprint-sha-1", [] { return CertificateThumbprint(1); });
-  RegisterValueProvider("ssl-thumbprint-sha-256", [] { return CertificateThumbprint(256); });
-  RegisterValueProvider("ssl-thumbprint-sha-512", [] { return CertificateThumbprint(512); });
-  RegisterValueProvider("ssh-dsa-fingerprint", [] { return HostKeyFingerprint(kDsaHostKeyPath); });
-  RegisterValueProvider("ssh-rsa-fingerprint", [] { return HostKeyFingerprint(kRsaHostKeyPath); });
+  RegisterFileValue("ssl-thumbprint-sha-1", kHostCertificatePath,
+                    [] { return CertificateThumbprint(1); });
+  RegisterFileValue("ssl-thumbprint-sha-256", kHostCertificatePath,
+                    [] { return CertificateThumbprint(256); });
+  RegisterFileValue("ssl-thumbprint-sha-512", kHostCertificatePath,
+                    [] { return CertificateThumbprint(512); });
+  RegisterFileValue("ssh-dsa-fingerprint", kDsaHostKeyPath,
+                    [] { return HostKeyFingerprint(kDsaHostKeyPath); });
+  RegisterFileValue("ssh-rsa-fingerprint", kRsaHostKeyPath,
+                    [] { return HostKeyFingerprint(kRsaHostKeyPath); });
 }
 
 }  // namespace Tulk

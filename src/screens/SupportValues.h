@@ -54,8 +54,10 @@ std::string ParseThumbprint(const std::string& output);
 std::string SecondWord(const std::string& output);
 
 /// Registers the five value keys above with the markup renderer
-/// (render/HostValues.h). Called once at start-up, before the first frame
-/// is drawn.
+/// (render/HostValues.h). Each value is computed when first shown and again
+/// only when its file changed (FileValueCache), so a redraw of the support
+/// page runs no program. Called once at start-up, before the first frame is
+/// drawn.
 void RegisterSupportValueProviders();
 
 }  // namespace Tulk

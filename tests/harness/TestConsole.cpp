@@ -136,7 +136,11 @@ std::vector<std::string> TestConsole::BuildEnvironment() const {
     env["PAM_WRAPPER_SERVICE_DIR"] = (folder_ / "pam").string();
 #ifdef TULK_TEST_SANITIZED
     // The sanitizer runtime cannot come first when a library is preloaded.
+    // pam_wrapper loads libpam with RTLD_DEEPBIND, which the sanitizer
+    // runtime refuses; this release reads the switch under the name of its
+    // sibling wrapper, so both names are set.
     env["PAM_WRAPPER_DISABLE_DEEPBIND"] = "1";
+    env["UID_WRAPPER_DISABLE_DEEPBIND"] = "1";
     std::string asan = env.count("ASAN_OPTIONS") != 0 ? env["ASAN_OPTIONS"] + ":" : "";
     env["ASAN_OPTIONS"] = asan + "verify_asan_link_order=0";
 #endif

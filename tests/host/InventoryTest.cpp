@@ -240,7 +240,7 @@ TEST_F(InventoryTest, RendererValuesComeFromTheHost) {
                            "5.10.50.00", "1.0.9", "3.2.0"}));
   std::string line = "kept";
   ASSERT_TRUE(Tulk::GetVersionLineSource()(line));
-  EXPECT_EQ(line, "Brimlo Tavi 8.1.0 (HyKernel Releasebuild-24519031 Build 24519031)");
+  EXPECT_EQ(line, "Brimlo Tavi 8.1.0 (HyKernel 8.1.0 Build 24519031)");
 
   state_["hardware"]["assetTag"] = "";
   Fault("HSI_Get");

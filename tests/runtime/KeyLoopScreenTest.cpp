@@ -69,6 +69,18 @@ TEST(KeyLoop, LoneEscActsWithinFiftyMilliseconds) {
                            << " ms";
 }
 
+TEST(KeyLoop, KeyRightAfterEscIsNotHeldBack) {
+  TestConsole console(KeyEcho());
+  ASSERT_TRUE(console.WaitForText("KEYECHO active"));
+  // Both bytes in one write: curses reads the second while it checks
+  // whether the Esc starts a sequence, and must still deliver it at once.
+  console.Send(
+      "\x1b"
+      "a");
+  ASSERT_TRUE(console.WaitForText("keys: 2", 1000ms));
+  EXPECT_TRUE(console.Contains("last key: a (97)")) << console.Dump();
+}
+
 TEST(KeyLoop, SequenceSplitLikeASlowSerialLineIsStillAssembled) {
   TestConsole console(KeyEcho());
   ASSERT_TRUE(console.WaitForText("KEYECHO active"));

@@ -126,7 +126,16 @@ INSTANTIATE_TEST_SUITE_P(
                     "User does not have permission to login to TULK."},
         FailedLogin{"root", "tulk", "root:expired", "Password has expired for user root",
                     "Password expired", "Access denied for user root",
-                    "You will be prompted to set a new password and then"}));
+                    "You will be prompted to set a new password and then"}),
+    [](const ::testing::TestParamInfo<FailedLogin>& param) {
+      std::string name;
+      for (char c : std::string(param.param.reason)) {
+        if (c != ' ') {
+          name += c;
+        }
+      }
+      return name;
+    });
 
 TEST(LoginScreenTest, FailedLoginKeepsTheNameAndCanBeRetried) {
   TestConsole console(ConsoleOptions());

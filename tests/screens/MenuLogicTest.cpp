@@ -1,12 +1,18 @@
 // Pure logic of the System Customization menu: log choice by digit and the
-// log list, support pages, tool output parsing, environment override.
+// log list, support pages, tool output parsing, environment override, the
+// cache of file-derived values.
 
 #include <gtest/gtest.h>
 
+#include <unistd.h>
+
 #include <cstdlib>
+#include <filesystem>
+#include <fstream>
 #include <sstream>
 
 #include "screens/EnvironmentOverride.h"
+#include "screens/FileValueCache.h"
 #include "screens/LogTable.h"
 #include "screens/SupportPages.h"
 #include "screens/SupportValues.h"
@@ -86,3 +92,22 @@ TEST(EnvironmentOverrideTest, UnsetVariableComesBackSetAndEmpty) {
 
 }  // namespace
 }  // namespace Tulk
+
+TEST(FileValueCacheTest, ComputesAgainOnlyWhenTheFileChanges) {
+  const std::filesystem::path path =
+      std::filesystem::temp_directory_path() / ("tulk-cache-" + std::to_string(getpid()));
+  std::filesystem::remove(path);
+  int computed = 0;
+  Tulk::FileValueCache cache(path.string(), [&] { return "value " + std::to_string(++computed); });
+
+  EXPECT_EQ(cache.Get(), "value 1");  // missing file: computed once
+  EXPECT_EQ(cache.Get(), "value 1");
+  std::ofstream(path) << "first";
+  EXPECT_EQ(cache.Get(), "value 2");  // appeared
+  EXPECT_EQ(cache.Get(), "value 2");
+  std::ofstream(path) << "second, longer";
+  EXPECT_EQ(cache.Get(), "value 3");  // changed
+  std::filesystem::remove(path);
+  EXPECT_EQ(cache.Get(), "value 4");  // went away
+  EXPECT_EQ(computed, 4);
+}

@@ -3,8 +3,10 @@
 // screens of other folders opened through the registry.
 
 #include <gtest/gtest.h>
+
 #include <signal.h>
 
+#include <algorithm>
 #include <filesystem>
 #include <fstream>
 
@@ -195,6 +197,16 @@ TEST(MenuScreenTest, UnreadableCertificateLeavesTheThumbprintEmpty) {
   ASSERT_TRUE(SelectEntry(console, "View Support Information"));
   EXPECT_TRUE(console.WaitForText("sha256=[]"));
   EXPECT_TRUE(console.WaitForLog("<11>Failed to generate the host's SHA256 SSL thumbprint"));
+  // Redraws of the page reuse the value: the unchanged file is not read again.
+  console.Key("Up");
+  console.WaitQuiet();
+  console.Key("Down");
+  EXPECT_TRUE(console.WaitForText("sha256=[]"));
+  console.WaitQuiet();
+  const std::vector<std::string> lines = console.LogLines();
+  EXPECT_EQ(std::count(lines.begin(), lines.end(),
+                       "<11>Failed to generate the host's SHA256 SSL thumbprint"),
+            1);
 }
 
 TEST(MenuScreenTest, RegisteredScreensOpenAndAVanishedInterfaceIsReported) {

@@ -123,6 +123,14 @@ TEST(PasswordScreenTest, SamePasswordAsksFirstThenChangesAndReports) {
   const auto audits = PasswordAudits(console);
   ASSERT_EQ(audits.size(), 1u);
   EXPECT_EQ(audits[0]["result"], "success");
+  // The event follows the log line.
+  ASSERT_TRUE(SessionTest::WaitUntil(
+      console,
+      [&] {
+        return !RecordsWhere(console, "events.jsonl", "id", "qob.user.tulk.login.passwd.changed")
+                    .empty();
+      },
+      "the password-changed event"));
   const auto events =
       RecordsWhere(console, "events.jsonl", "id", "qob.user.tulk.login.passwd.changed");
   ASSERT_EQ(events.size(), 1u);

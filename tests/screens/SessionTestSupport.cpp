@@ -5,41 +5,14 @@
 
 namespace SessionTest {
 
-namespace {
-
-constexpr char kPasswordFile[] = "/etc/pam-matrix/passdb";
-constexpr char kPolicyFile[] = "/etc/pam-matrix/policy";
-
-void WritePamConfiguration(const std::filesystem::path& root, const PamSetup& pam) {
-  std::string users;
-  for (const auto& [user, password] : pam.users) {
-    users += user + ":" + password + ":tulk\n";
-  }
-  TulkTest::WriteRootFile(root, kPasswordFile, users);
-  std::string policy;
-  for (const std::string& line : pam.policy) {
-    policy += line + "\n";
-  }
-  TulkTest::WriteRootFile(root, kPolicyFile, policy);
-  const std::string matrix = std::string(SESSION_TEST_PAM_MATRIX_MODULE) +
-                             " passdb=" + (root / "etc/pam-matrix/passdb").string();
-  const std::string checks = std::string(SESSION_TEST_PAM_POLICY_MODULE) +
-                             " policy=" + (root / "etc/pam-matrix/policy").string();
-  TulkTest::WriteRootFile(root, "/etc/pam.d/tulk",
-                          "auth     required  " + matrix + "\n" + "account  requisite " + checks +
-                              "\n" + "account  required  " + matrix + "\n" + "password requisite " +
-                              checks + "\n" + "password required  " + matrix + "\n");
-}
-
-}  // namespace
-
 TulkTest::Options ConsoleOptions(const nlohmann::json& host, const PamSetup& pam,
                                  std::function<void(const std::filesystem::path&)> prepare) {
   TulkTest::Options options;
   options.hostState = host.dump();
-  options.prepareRoot = [pam, prepare](const std::filesystem::path& root) {
+  options.pamUsers = pam.users;
+  options.pamPolicy = pam.policy;
+  options.prepareRoot = [prepare](const std::filesystem::path& root) {
     TulkTest::WriteRootFile(root, "/var/run/brimlo/show-tulk-login");
-    WritePamConfiguration(root, pam);
     if (prepare) {
       prepare(root);
     }
@@ -48,7 +21,7 @@ TulkTest::Options ConsoleOptions(const nlohmann::json& host, const PamSetup& pam
 }
 
 std::filesystem::path PasswordFile(const TulkTest::TestConsole& console) {
-  return console.Root() / std::filesystem::path(kPasswordFile).relative_path();
+  return console.PamPasswordFile();
 }
 
 ::testing::AssertionResult LogIn(TulkTest::TestConsole& console, const std::string& user,

@@ -3,11 +3,9 @@
 // console-login marker, logging in, and waiting on the simulated host's
 // record files.
 //
-// Logins go through the real PAM library with the root's own configuration
-// ("<root>/etc/pam.d/tulk", which the console reads when it is confined to
-// a root): pam_matrix with a password file in the root, and the test policy
-// module (tests/pam) before it. No library is preloaded, so the same tests
-// run in the sanitizer build.
+// Logins go through the real PAM library wrapped by pam_wrapper (the
+// harness's PAM set-up): pam_matrix with a password file in the test folder,
+// and the test policy module (tests/pam) before it.
 
 #include <chrono>
 #include <filesystem>

@@ -9,7 +9,7 @@ nlohmann::json DemoHostState() {
     "name": "Brimlo Tavi",
     "version": "8.1.0",
     "build": "24519031",
-    "kernelRelease": "Releasebuild-24519031",
+    "kernelRelease": "8.1.0",
     "compilationOption": "release",
     "uuid": "6a3f0c2e-41d7-4b8e-9c55-2f7e1d0b8a41"
   },
