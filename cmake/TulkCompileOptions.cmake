@@ -10,6 +10,10 @@ if(TULK_SANITIZE)
     -fno-sanitize-recover=undefined -fno-omit-frame-pointer)
   target_link_options(tulk_options INTERFACE -fsanitize=address,undefined)
 endif()
+if(NOT TULK_SANITIZE)
+  # Lets the linker drop unused functions from the console binary.
+  target_compile_options(tulk_options INTERFACE -ffunction-sections -fdata-sections)
+endif()
 # Every source file sees the project's own headers by folder name, for
 # example #include "runtime/KeyInput.h".
 target_include_directories(tulk_options INTERFACE ${PROJECT_SOURCE_DIR}/src)

@@ -5,6 +5,7 @@
 //
 //   tulk-console-bench [--runs N] [--idle-seconds S]
 
+#include <algorithm>
 #include <chrono>
 #include <cstdio>
 #include <cstdlib>
@@ -13,7 +14,6 @@
 #include <string>
 #include <thread>
 #include <vector>
-#include <algorithm>
 
 #include "ConsoleScenarios.h"
 #include "ProcessProbe.h"

@@ -1,6 +1,8 @@
 #include "ConsoleScenarios.h"
 
 #include <chrono>
+#include <filesystem>
+#include <fstream>
 #include <thread>
 
 #include "ProcessProbe.h"
@@ -27,9 +29,15 @@ Clock::time_point Settle(TulkTest::TestConsole& console, std::chrono::millisecon
   return last;
 }
 
+// The demo host with console login allowed and the demo users.
 TulkTest::Options BenchOptions() {
   TulkTest::Options options;
   options.start = false;
+  options.pamUsers = {{"root", "tulk"}};
+  options.prepareRoot = [](const std::filesystem::path& root) {
+    std::filesystem::create_directories(root / "var/run/brimlo");
+    std::ofstream(root / "var/run/brimlo/show-tulk-login");
+  };
   return options;
 }
 
@@ -46,11 +54,44 @@ double BytesForKey(TulkTest::TestConsole& console, const std::string& key) {
   return static_cast<double>(console.BytesReceived() - before);
 }
 
+void MeasureIdle(TulkTest::TestConsole& console, const BenchSettings& settings, Figure& cpu,
+                 Figure& wakeups) {
+  Settle(console, 300ms);
+  ProcessUsage before = ReadUsage(console.Pid());
+  std::this_thread::sleep_for(std::chrono::seconds(settings.idleSeconds));
+  ProcessUsage after = ReadUsage(console.Pid());
+  cpu.values.push_back(after.cpuMillis - before.cpuMillis);
+  wakeups.values.push_back(static_cast<double>(after.contextSwitches - before.contextSwitches));
+}
+
+bool OpenLogin(TulkTest::TestConsole& console) {
+  if (!console.WaitForText("Customize System/View Logs")) {
+    return false;
+  }
+  Settle(console, 150ms);
+  console.Key("F2");
+  return console.WaitForText("Authentication Required");
+}
+
+bool LogIn(TulkTest::TestConsole& console) {
+  if (!OpenLogin(console)) {
+    return false;
+  }
+  Settle(console, 150ms);
+  console.Key("Down");
+  console.Type("tulk");
+  console.Key("Enter");
+  return console.WaitForText("System Customization");
+}
+
 }  // namespace
 
 std::vector<Figure> RunScenarios(const BenchSettings& settings) {
-  Figure startup{"startup_to_settled_screen", "ms", {}};
-  Figure peak{"peak_resident_memory", "KiB", {}};
+  const std::string idleUnit = "/" + std::to_string(settings.idleSeconds) + "s";
+  std::vector<Figure> figures;
+
+  Figure startup{"startup_to_settled_welcome", "ms", {}};
+  Figure peak{"peak_resident_welcome", "KiB", {}};
   Figure welcomeBytes{"welcome_screen_bytes", "bytes", {}};
   for (int run = 0; run < settings.runs; ++run) {
     TulkTest::TestConsole console(BenchOptions());
@@ -61,29 +102,55 @@ std::vector<Figure> RunScenarios(const BenchSettings& settings) {
     peak.values.push_back(static_cast<double>(ReadUsage(console.Pid()).peakResidentKiB));
     welcomeBytes.values.push_back(static_cast<double>(console.BytesReceived()));
   }
+  figures.insert(figures.end(), {startup, peak, welcomeBytes});
 
-  Figure anyKey{"welcome_any_key_bytes", "bytes", {}};
+  Figure anyKey{"welcome_repaint_key_bytes", "bytes", {}};
+  Figure idleWelcomeCpu{"idle_welcome_cpu", "ms" + idleUnit, {}};
+  Figure idleWelcomeWakeups{"idle_welcome_wakeups", idleUnit, {}};
   {
     TulkTest::TestConsole console(BenchOptions());
     console.Start();
     for (int run = 0; run < settings.runs; ++run) {
       anyKey.values.push_back(BytesForKey(console, "x"));
     }
+    MeasureIdle(console, settings, idleWelcomeCpu, idleWelcomeWakeups);
   }
+  figures.insert(figures.end(), {anyKey, idleWelcomeCpu, idleWelcomeWakeups});
 
-  Figure idleCpu{"idle_welcome_cpu", "ms/" + std::to_string(settings.idleSeconds) + "s", {}};
-  Figure idleWakeups{"idle_welcome_wakeups", "/" + std::to_string(settings.idleSeconds) + "s", {}};
+  Figure firstChar{"login_name_first_char_bytes", "bytes", {}};
+  Figure nextChar{"login_name_next_char_bytes", "bytes", {}};
   {
     TulkTest::TestConsole console(BenchOptions());
     console.Start();
-    Settle(console, 300ms);
-    ProcessUsage before = ReadUsage(console.Pid());
-    std::this_thread::sleep_for(std::chrono::seconds(settings.idleSeconds));
-    ProcessUsage after = ReadUsage(console.Pid());
-    idleCpu.values.push_back(after.cpuMillis - before.cpuMillis);
-    idleWakeups.values.push_back(static_cast<double>(after.contextSwitches - before.contextSwitches));
+    if (OpenLogin(console)) {
+      firstChar.values.push_back(BytesForKey(console, "a"));
+      for (int run = 0; run < settings.runs; ++run) {
+        nextChar.values.push_back(BytesForKey(console, "b"));
+      }
+    }
   }
-  return {startup, peak, welcomeBytes, anyKey, idleCpu, idleWakeups};
+  figures.insert(figures.end(), {firstChar, nextChar});
+
+  Figure firstDown{"menu_first_down_bytes", "bytes", {}};
+  Figure anyDown{"menu_down_bytes_each_entry", "bytes", {}};
+  Figure peakMenu{"peak_resident_menu", "KiB", {}};
+  Figure idleMenuCpu{"idle_menu_cpu", "ms" + idleUnit, {}};
+  Figure idleMenuWakeups{"idle_menu_wakeups", idleUnit, {}};
+  {
+    TulkTest::TestConsole console(BenchOptions());
+    console.Start();
+    if (LogIn(console)) {
+      firstDown.values.push_back(BytesForKey(console, "Down"));
+      anyDown.values.push_back(firstDown.values.back());
+      for (int entry = 0; entry < 12; ++entry) {
+        anyDown.values.push_back(BytesForKey(console, "Down"));
+      }
+      peakMenu.values.push_back(static_cast<double>(ReadUsage(console.Pid()).peakResidentKiB));
+      MeasureIdle(console, settings, idleMenuCpu, idleMenuWakeups);
+    }
+  }
+  figures.insert(figures.end(), {firstDown, anyDown, peakMenu, idleMenuCpu, idleMenuWakeups});
+  return figures;
 }
 
 }  // namespace TulkBench

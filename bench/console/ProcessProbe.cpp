@@ -42,8 +42,8 @@ ProcessUsage ReadUsage(pid_t pid) {
         break;
       }
     }
-    usage.cpuMillis = static_cast<double>(utime + stime) * 1000.0 /
-                      static_cast<double>(sysconf(_SC_CLK_TCK));
+    usage.cpuMillis =
+        static_cast<double>(utime + stime) * 1000.0 / static_cast<double>(sysconf(_SC_CLK_TCK));
   }
   usage.peakResidentKiB = StatusField(proc / "status", "VmHWM:");
   std::error_code error;

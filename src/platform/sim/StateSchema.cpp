@@ -12,7 +12,7 @@ using nlohmann::json;
 
 enum class Type { kString, kInteger, kBoolean, kObject, kArray, kMac, kIpv4, kIpv6, kIp, kAny };
 
-struct Spec {
+struct FieldRule {
   const char* key;
   Type type;
   bool required = false;
@@ -96,20 +96,20 @@ std::string Join(const std::string& path, const char* key) {
 
 // Checks the listed fields of `object`; returns false when `object` is
 // absent (null pointer).
-bool Fields(const json* object, const std::string& path, std::initializer_list<Spec> specs) {
+bool Fields(const json* object, const std::string& path, std::initializer_list<FieldRule> rules) {
   if (object == nullptr) {
     return false;
   }
   Expect(*object, path, Type::kObject);
-  for (const Spec& spec : specs) {
-    auto found = object->find(spec.key);
+  for (const FieldRule& rule : rules) {
+    auto found = object->find(rule.key);
     if (found == object->end()) {
-      if (spec.required) {
-        Fail(Join(path, spec.key) + " is missing");
+      if (rule.required) {
+        Fail(Join(path, rule.key) + " is missing");
       }
       continue;
     }
-    Expect(*found, Join(path, spec.key), spec.type);
+    Expect(*found, Join(path, rule.key), rule.type);
   }
   return true;
 }

@@ -1,0 +1,23 @@
+#!/usr/bin/env bash
+# Builds the release configuration and runs every benchmark:
+#   - the whole console in a pseudo-terminal (bench/console): start-up to a
+#     settled screen, peak memory, bytes written per key, idle cost;
+#   - Google Benchmark suites of the renderer, host layer, simulated host and
+#     menu (bench/render, bench/host, bench/platform, bench/screens).
+# Output format: the console benchmark prints "figure median min max unit"
+# lines; the others print Google Benchmark's console table.
+#   scripts/bench.sh [--runs N] [--idle-seconds S]
+set -euo pipefail
+cd "$(dirname "$0")/.."
+scripts/setup.sh
+scripts/build.sh default >/dev/null
+
+echo "== console"
+build/default/bench/console/tulk-console-bench "$@"
+for suite in build/default/bench/render/* build/default/bench/host/* \
+             build/default/bench/platform/* build/default/bench/screens/*; do
+  if [[ -f $suite && -x $suite ]]; then
+    echo "== $(basename "$suite")"
+    "$suite" --benchmark_min_time=0.2
+  fi
+done
