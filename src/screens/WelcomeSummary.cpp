@@ -2,13 +2,19 @@
 
 #include <algorithm>
 #include <cctype>
-#include <cmath>
 #include <cstdio>
 
 #include "render/StringFactory.h"
 
 namespace Tulk {
 namespace {
+
+// roundf() for the non-negative values of the memory line, without pulling
+// the maths library into the console for one call: the sum is exact in
+// double precision and truncation is floor for non-negative values.
+float RoundHalfUp(float value) {
+  return static_cast<float>(static_cast<std::uint64_t>(static_cast<double>(value) + 0.5));
+}
 
 constexpr std::uint32_t kAddressHeading = 141;
 constexpr std::uint32_t kDhcpWarning = 142;
@@ -65,7 +71,7 @@ std::string WelcomeSummary::MemoryLine(std::uint64_t bytes) {
     ++unit;
     divisor *= 1024;
   }
-  const float tenths = std::round(static_cast<float>(bytes) * 10.0f / static_cast<float>(divisor));
+  const float tenths = RoundHalfUp(static_cast<float>(bytes) * 10.0f / static_cast<float>(divisor));
   // "%g" is the stream's default format for a float: 16, 1.5, 15.9.
   char line[48];
   std::snprintf(line, sizeof line, "%g %ciB Memory", static_cast<double>(tenths / 10.0f),
