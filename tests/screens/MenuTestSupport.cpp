@@ -15,20 +15,6 @@ TulkTest::Options DriverOptions(const nlohmann::json& host, const std::string& s
   return options;
 }
 
-::testing::AssertionResult WaitUntil(TulkTest::TestConsole& console,
-                                     const std::function<bool()>& condition,
-                                     const std::string& what, std::chrono::milliseconds timeout) {
-  const auto deadline = std::chrono::steady_clock::now() + timeout;
-  while (!condition()) {
-    if (std::chrono::steady_clock::now() > deadline) {
-      return ::testing::AssertionFailure() << "timed out waiting for " << what << "\n"
-                                           << console.Dump();
-    }
-    console.Pump(std::chrono::milliseconds(20));
-  }
-  return ::testing::AssertionSuccess();
-}
-
 ::testing::AssertionResult Shown(TulkTest::TestConsole& console, const std::string& text) {
   ::testing::AssertionResult shown = console.WaitForText(text);
   console.WaitQuiet();

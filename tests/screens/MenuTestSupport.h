@@ -19,11 +19,8 @@ namespace MenuTest {
 TulkTest::Options DriverOptions(const nlohmann::json& host = TulkTest::DemoHostState(),
                                 const std::string& scene = "menu");
 
-/// Waits until `condition` holds, pumping the console's output meanwhile.
-::testing::AssertionResult WaitUntil(TulkTest::TestConsole& console,
-                                     const std::function<bool()>& condition,
-                                     const std::string& what,
-                                     std::chrono::milliseconds timeout = std::chrono::seconds(5));
+/// Waits until a condition holds (ScreenTestSupport.h).
+using TulkTest::WaitUntil;
 
 /// Waits for `text` to appear (or, for Gone, to disappear), then until the
 /// console is quiet: a frame discards the keys typed while it is drawn, so

@@ -34,4 +34,17 @@ void WriteRootFile(const std::filesystem::path& root, const std::string& path,
   std::ofstream(file) << text;
 }
 
+::testing::AssertionResult WaitUntil(TestConsole& console, const std::function<bool()>& condition,
+                                     const std::string& what, std::chrono::milliseconds timeout) {
+  const auto deadline = std::chrono::steady_clock::now() + timeout;
+  while (!condition()) {
+    if (std::chrono::steady_clock::now() > deadline) {
+      return ::testing::AssertionFailure() << "timed out waiting for " << what << "\n"
+                                           << console.Dump();
+    }
+    console.Pump(std::chrono::milliseconds(20));
+  }
+  return ::testing::AssertionSuccess();
+}
+
 }  // namespace TulkTest

@@ -7,11 +7,17 @@
 ///   TulkTest::Options options;
 ///   options.hostState = host.dump();
 
+#include <gtest/gtest.h>
+
+#include <chrono>
 #include <filesystem>
+#include <functional>
 #include <string>
 #include <vector>
 
 #include <nlohmann/json.hpp>
+
+#include "TestConsole.h"
 
 namespace TulkTest {
 
@@ -30,5 +36,11 @@ nlohmann::json ReadHostState(const std::filesystem::path& stateFile);
 /// "/var/run/brimlo/show-tulk-login"), creating the folders.
 void WriteRootFile(const std::filesystem::path& root, const std::string& path,
                    const std::string& text = "");
+
+/// Waits until `condition` holds, pumping the console's output meanwhile;
+/// the failure names `what` and dumps the screen.
+::testing::AssertionResult WaitUntil(TestConsole& console, const std::function<bool()>& condition,
+                                     const std::string& what,
+                                     std::chrono::milliseconds timeout = std::chrono::seconds(5));
 
 }  // namespace TulkTest

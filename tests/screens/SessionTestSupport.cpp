@@ -54,20 +54,6 @@ std::filesystem::path PasswordFile(const TulkTest::TestConsole& console) {
   return gone;
 }
 
-::testing::AssertionResult WaitUntil(TulkTest::TestConsole& console,
-                                     const std::function<bool()>& condition,
-                                     const std::string& what, std::chrono::milliseconds timeout) {
-  const auto deadline = std::chrono::steady_clock::now() + timeout;
-  while (!condition()) {
-    if (std::chrono::steady_clock::now() > deadline) {
-      return ::testing::AssertionFailure() << "timed out waiting for " << what << "\n"
-                                           << console.Dump();
-    }
-    console.Pump(std::chrono::milliseconds(20));
-  }
-  return ::testing::AssertionSuccess();
-}
-
 std::vector<nlohmann::json> RecordsWhere(const TulkTest::TestConsole& console,
                                          const std::string& file, const std::string& key,
                                          const std::string& value) {

@@ -56,11 +56,8 @@ std::filesystem::path PasswordFile(const TulkTest::TestConsole& console);
 ::testing::AssertionResult Settled(TulkTest::TestConsole& console, const std::string& text);
 ::testing::AssertionResult Gone(TulkTest::TestConsole& console, const std::string& text);
 
-/// Waits until `condition` holds, pumping the console's output meanwhile.
-::testing::AssertionResult WaitUntil(TulkTest::TestConsole& console,
-                                     const std::function<bool()>& condition,
-                                     const std::string& what,
-                                     std::chrono::milliseconds timeout = std::chrono::seconds(5));
+/// Waits until a condition holds (ScreenTestSupport.h).
+using TulkTest::WaitUntil;
 
 /// The records of `file` (audit.jsonl, events.jsonl, commands.jsonl) whose
 /// `key` equals `value`.
