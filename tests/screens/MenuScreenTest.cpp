@@ -198,6 +198,7 @@ TEST(MenuScreenTest, UnreadableCertificateLeavesTheThumbprintEmpty) {
   EXPECT_TRUE(console.WaitForText("sha256=[]"));
   EXPECT_TRUE(console.WaitForLog("<11>Failed to generate the host's SHA256 SSL thumbprint"));
   // Redraws of the page reuse the value: the unchanged file is not read again.
+  console.WaitQuiet();
   console.Key("Up");
   console.WaitQuiet();
   console.Key("Down");
