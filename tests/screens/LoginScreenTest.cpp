@@ -5,6 +5,7 @@
 #include <signal.h>
 
 #include <fstream>
+#include <ostream>
 
 #include "SessionTestSupport.h"
 
@@ -94,6 +95,10 @@ struct FailedLogin {
   const char* eventText;
   const char* message;
 };
+
+void PrintTo(const FailedLogin& login, std::ostream* out) {
+  *out << login.reason;
+}
 
 class FailedLoginTest : public ::testing::TestWithParam<FailedLogin> {};
 
