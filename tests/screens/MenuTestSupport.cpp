@@ -38,7 +38,11 @@ std::string RightTitle(const TulkTest::TestConsole& console, int cols) {
 ::testing::AssertionResult SelectEntry(TulkTest::TestConsole& console, const std::string& title,
                                        int cols) {
   console.WaitForText("System Customization");
+  console.WaitQuiet();
   for (int step = 0; step < 20; ++step) {
+    // Read the title only once the move has been drawn completely: a title
+    // read half-way through an update matches neither entry.
+    console.WaitQuiet(std::chrono::milliseconds(60));
     const std::string shown = RightTitle(console, cols);
     if (shown == title) {
       console.WaitQuiet();
