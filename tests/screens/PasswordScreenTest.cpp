@@ -37,9 +37,13 @@ std::string PasswordFile(const TestConsole& console) {
   return SessionTest::Settled(console, kDialogText);
 }
 
+// Waits for the cursor to stand on the field labelled `label`, then for the
+// redraw that moved it to end.
 ::testing::AssertionResult CursorOn(TestConsole& console, const std::string& label) {
-  return WaitUntil(
+  auto moved = WaitUntil(
       console, [&] { return console.Cursor().row == RowOf(console, label); }, label);
+  console.WaitQuiet();
+  return moved;
 }
 
 std::vector<json> PasswordAudits(const TestConsole& console) {
