@@ -34,7 +34,7 @@ int CountRuns(const TestConsole& console, const std::string& name) {
   if (auto login = LogIn(console, "root", SessionTest::kRootPassword, "F12"); !login) {
     return login;
   }
-  return console.WaitForText("[ ] Forcefully terminate running VMs, if any ...");
+  return Settled(console, "[ ] Forcefully terminate running VMs, if any ...");
 }
 
 std::string Power(const TestConsole& console) {
