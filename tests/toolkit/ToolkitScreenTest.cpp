@@ -122,6 +122,7 @@ TEST(ToolkitScreen, IdleDialogDimsAndTheWakingKeyRestoresIt) {
   options.timeScale = 120;  // the minute passes in half a second
   TestConsole console(options);
   ASSERT_TRUE(console.WaitForText("Demo Dialog"));
+  console.WaitQuiet(50ms);  // the body may still be on its way; dimming is half a second off
   EXPECT_TRUE(HasColors(console, 9, 13, kDarkGrey, kWhite));
   console.WaitQuiet(1500ms, 5s);
   EXPECT_TRUE(HasColors(console, 9, 13, kBlack, kDarkGrey));
