@@ -4,6 +4,7 @@
 #include <gtest/gtest.h>
 #include <signal.h>
 
+#include <algorithm>
 #include <chrono>
 #include <string>
 #include <thread>
@@ -59,13 +60,19 @@ TEST(KeyLoop, TerminalSequencesArriveAsCursesKeys) {
 TEST(KeyLoop, LoneEscActsWithinFiftyMilliseconds) {
   TestConsole console(KeyEcho());
   ASSERT_TRUE(console.WaitForText("KEYECHO active"));
-  console.WaitQuiet();
-  auto sent = std::chrono::steady_clock::now();
-  console.Key("Esc");
-  ASSERT_TRUE(console.WaitForText("(27)", 1000ms));
-  auto elapsed = std::chrono::steady_clock::now() - sent;
-  EXPECT_LT(elapsed, 50ms) << "Esc took "
-                           << std::chrono::duration_cast<std::chrono::milliseconds>(elapsed).count()
+  // The fastest of three presses: a wrong escape delay slows every one of
+  // them, a busy test machine only some.
+  auto fastest = std::chrono::steady_clock::duration::max();
+  for (int press = 1; press <= 3 && fastest >= 50ms; ++press) {
+    console.WaitQuiet();
+    auto sent = std::chrono::steady_clock::now();
+    console.Key("Esc");
+    ASSERT_TRUE(console.WaitForText("keys: " + std::to_string(press), 2000ms));
+    fastest = std::min(fastest, std::chrono::steady_clock::now() - sent);
+    EXPECT_TRUE(console.Contains("(27)")) << console.Dump();
+  }
+  EXPECT_LT(fastest, 50ms) << "Esc took "
+                           << std::chrono::duration_cast<std::chrono::milliseconds>(fastest).count()
                            << " ms";
 }
 
