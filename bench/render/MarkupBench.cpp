@@ -31,8 +31,8 @@ std::string FullAreaText() {
       "{align:padding:10}Portset{/align}{align:padding:20}Portgroup{/align}\n";
   for (int i = 0; i < 3; ++i) {
     text +=
-        "  {align:padding:8}vmk" + std::to_string(i) +
-        "{/align}{align:padding:19}00:50:56:6a:bc:0" + std::to_string(i) +
+        "  {align:padding:8}hyk" + std::to_string(i) +
+        "{/align}{align:padding:19}02:00:00:6a:bc:0" + std::to_string(i) +
         "{/align}{align:padding:10}vSwitch0{/align}{align:padding:20}Management Network{/align}\n";
   }
   text += "\nHost {hostname} with {memory}: " + std::string(texts.GetString(243)) + "\n\n";

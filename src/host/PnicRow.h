@@ -12,7 +12,7 @@ struct PnicRow {
   std::string name;
   /// The description of its PCI device; "N/A" when the device gives none.
   std::string hardwareLabel;
-  /// The MAC address text, such as "00:50:56:01:02:03".
+  /// The MAC address text, such as "02:00:00:01:02:03".
   std::string mac;
   /// "Connected" when the link is up, "Disconnected" otherwise.
   std::string linkState;

@@ -25,8 +25,8 @@ TEST(InfoTypeTest, RowValuesAreShortenedAtTheirLimits) {
     std::string shownMac;
   };
   const Case cases[] = {
-      {"vmk012", "00:50:56:aa:bb:cc", "vmk012", "00:50:56:aa:bb:cc"},
-      {"vmk0123", "00:50:56:aa:bb:cc:d", "vmk...", "00:50:56:aa:bb..."},
+      {"hyk012", "02:00:00:aa:bb:cc", "hyk012", "02:00:00:aa:bb:cc"},
+      {"hyk0123", "02:00:00:aa:bb:cc:d", "hyk...", "02:00:00:aa:bb..."},
   };
   for (const Case& c : cases) {
     std::string row = Laid(HykNicInfo(c.name, c.mac, "vSwitch0", "Management Network").Row());
@@ -36,7 +36,7 @@ TEST(InfoTypeTest, RowValuesAreShortenedAtTheirLimits) {
 }
 
 TEST(InfoTypeTest, RowColumnsLineUpWithTheHeadingAfterItsTwoBlanks) {
-  HykNicInfo nic("vmk0", "00:50:56:aa:bb:cc", "vSwitch0", "A portgroup far too long to fit");
+  HykNicInfo nic("hyk0", "02:00:00:aa:bb:cc", "vSwitch0", "A portgroup far too long to fit");
   std::string heading = Laid(nic.Heading());
   std::string row = "  " + Laid(nic.Row());
   ASSERT_EQ(heading.size(), row.size());
