@@ -37,25 +37,16 @@ class Layout {
 
   std::string Run(std::string_view text) {
     out_.reserve(text.size() + static_cast<std::size_t>(std::max(width_, 0)));
-    std::size_t i = 0;
-    while (i < text.size()) {
-      char c = text[i];
-      if (c == '{') {
-        std::size_t close = text.find('}', i + 1);
-        if (close == std::string_view::npos) {
-          break;
-        }
-        Tag(text.substr(i + 1, close - i - 1));
-        i = close + 1;
-        continue;
-      }
-      if (c == '\n') {
-        TextNewline();
-      } else {
-        Visible(c);
-      }
-      ++i;
-    }
+    ScanMarkup(
+        text, [this](std::string_view tag) { Tag(tag); },
+        [this](char c) {
+          if (c == '\n') {
+            TextNewline();
+          } else {
+            Visible(c);
+          }
+          return true;
+        });
     return std::move(out_);
   }
 

@@ -25,32 +25,25 @@ class Painter {
   void Run(std::string_view text) {
     SetAttribute(style_.active ? ColorAttr(style_.background, style_.foreground)
                                : ColorAttr(kBlack, kDarkGrey));
-    std::size_t i = 0;
-    while (i < text.size()) {
-      char c = text[i];
-      if (c == '{') {
-        std::size_t close = text.find('}', i + 1);
-        if (close == std::string_view::npos) {
-          break;
-        }
-        Tag(text.substr(i + 1, close - i - 1));
-        i = close + 1;
-        continue;
-      }
-      if (c == '\n') {
-        Flush();
-        if (row_ + 1 >= height_) {
-          return;
-        }
-        ++row_;
-        column_ = 0;
-      } else {
-        unsigned char byte = static_cast<unsigned char>(c);
-        pending_ += (byte < 0x20 || byte == 0x7f) ? ' ' : c;
-      }
-      ++i;
+    const bool toTheEnd = ScanMarkup(
+        text, [this](std::string_view tag) { Tag(tag); },
+        [this](char c) {
+          if (c == '\n') {
+            Flush();
+            if (row_ + 1 >= height_) {
+              return false;  // the window is full
+            }
+            ++row_;
+            column_ = 0;
+          } else {
+            unsigned char byte = static_cast<unsigned char>(c);
+            pending_ += (byte < 0x20 || byte == 0x7f) ? ' ' : c;
+          }
+          return true;
+        });
+    if (toTheEnd) {
+      Flush();
     }
-    Flush();
   }
 
  private:
