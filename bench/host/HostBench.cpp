@@ -13,6 +13,7 @@
 #include <string>
 #include <vector>
 
+#include "ScratchFolder.h"
 #include "host/CommandRunner.h"
 #include "host/HardwareInventory.h"
 #include "host/ManagementNetwork.h"
@@ -104,12 +105,8 @@ BENCHMARK(GetVersionString)->DenseRange(1, 4);
 
 // A scratch root with the two programs the runner cases start, so nothing
 // of the real machine is run or changed.
-fs::path MakeScratchRoot() {
-  std::string pattern = (fs::temp_directory_path() / "tulk-host-bench-XXXXXX").string();
-  if (mkdtemp(pattern.data()) == nullptr) {
-    return {};
-  }
-  fs::path root = pattern;
+// Lays out a root whose /bin holds the few real programs the runner starts.
+void PrepareRoot(const fs::path& root) {
   fs::create_directories(root / "bin");
   fs::create_directories(root / "sbin");
   for (const char* program : {"true", "echo", "sh"}) {
@@ -121,22 +118,17 @@ fs::path MakeScratchRoot() {
       }
     }
   }
-  return root;
 }
 
 }  // namespace
 
 int main(int argc, char** argv) {
-  fs::path root = MakeScratchRoot();
-  if (root.empty()) {
+  TulkBench::ScratchFolder root("tulk-host-bench");
+  if (root.Path().empty()) {
     return 1;
   }
-  setenv("TULK_ROOT", root.c_str(), 1);
+  PrepareRoot(root.Path());
+  setenv("TULK_ROOT", root.Path().c_str(), 1);
   unsetenv("TULK_HOST_STATE");
-  benchmark::Initialize(&argc, argv);
-  benchmark::RunSpecifiedBenchmarks();
-  benchmark::Shutdown();
-  std::error_code ignored;
-  fs::remove_all(root, ignored);
-  return 0;
+  return TulkBench::RunBenchmarks(argc, argv);
 }

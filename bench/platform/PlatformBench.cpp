@@ -7,6 +7,7 @@
 #include <filesystem>
 #include <fstream>
 
+#include "ScratchFolder.h"
 #include "platform/api/AdvancedOption.h"
 #include "platform/api/DnsConfigImpl.h"
 #include "platform/api/HykernelNicInfoImpl.h"
@@ -124,17 +125,15 @@ BENCHMARK(Change)->Unit(benchmark::kMillisecond);
 }  // namespace
 
 int main(int argc, char** argv) {
-  std::string pattern = (std::filesystem::temp_directory_path() / "tulk-bench-XXXXXX").string();
-  const std::filesystem::path folder = mkdtemp(pattern.data());
+  TulkBench::ScratchFolder scratch("tulk-bench");
+  if (scratch.Path().empty()) {
+    return 1;
+  }
+  const std::filesystem::path& folder = scratch.Path();
   std::filesystem::create_directories(folder / "root");
   std::ofstream(folder / "host-state.json") << Sim::DemoHostState().dump(2);
   setenv("TULK_ROOT", (folder / "root").c_str(), 1);
   setenv("TULK_HOST_STATE", (folder / "host-state.json").c_str(), 1);
   Sim::SimHost::Instance().Load();
-
-  benchmark::Initialize(&argc, argv);
-  benchmark::RunSpecifiedBenchmarks();
-  benchmark::Shutdown();
-  std::filesystem::remove_all(folder);
-  return 0;
+  return TulkBench::RunBenchmarks(argc, argv);
 }

@@ -13,6 +13,7 @@
 #include <fstream>
 #include <string>
 
+#include "ScratchFolder.h"
 #include "screens/LogTable.h"
 #include "screens/MenuEntries.h"
 #include "screens/SupportValues.h"
@@ -54,16 +55,13 @@ void DescribeLogs(benchmark::State& state) {
 }
 BENCHMARK(DescribeLogs)->Unit(benchmark::kMicrosecond);
 
-fs::path MakeRoot() {
-  char pattern[] = "/tmp/tulk-menu-bench-XXXXXX";
-  if (mkdtemp(pattern) == nullptr) {
-    return {};
-  }
-  const fs::path root = pattern;
+// Installs the simulated host's tools, a certificate, an SSH host key and a
+// log into `root`; false when a step failed.
+bool PrepareRoot(const fs::path& root) {
 #ifdef TULK_BENCH_HOSTTOOL
   const std::string install = std::string(TULK_BENCH_HOSTTOOL) + " --install " + root.string();
   if (std::system(install.c_str()) != 0) {
-    return {};
+    return false;
   }
 #endif
   const std::string ssl = (root / "etc/brimlo/ssl").string();
@@ -74,26 +72,21 @@ fs::path MakeRoot() {
       "/host.key -out " + ssl + "/host.crt 2>/dev/null && ssh-keygen -q -t rsa -b 3072 -N '' -f " +
       ssh + "/ssh_host_rsa_key";
   if (std::system(keys.c_str()) != 0) {
-    return {};
+    return false;
   }
   fs::create_directories(root / "var/log");
   std::ofstream(root / "var/log/syslog.log") << "log\n";
-  return root;
+  return true;
 }
 
 }  // namespace
 
 int main(int argc, char** argv) {
-  const fs::path root = MakeRoot();
-  if (root.empty()) {
+  TulkBench::ScratchFolder root("tulk-menu-bench");
+  if (root.Path().empty() || !PrepareRoot(root.Path())) {
     return 1;
   }
-  setenv("TULK_ROOT", root.c_str(), 1);
+  setenv("TULK_ROOT", root.Path().c_str(), 1);
   unsetenv("TULK_HOST_STATE");
-  benchmark::Initialize(&argc, argv);
-  benchmark::RunSpecifiedBenchmarks();
-  benchmark::Shutdown();
-  std::error_code ignored;
-  fs::remove_all(root, ignored);
-  return 0;
+  return TulkBench::RunBenchmarks(argc, argv);
 }

@@ -67,7 +67,7 @@ TEST(LogScreenTest, ThreeLogsAreNumberedAndDigitsKeepTheirQuirks) {
   EXPECT_EQ(PagerRunFor(console, '2'), "hykernel.log");
   EXPECT_EQ(PagerRunFor(console, '5'), "mgmtd.log");
   EXPECT_EQ(PagerRunFor(console, '0'), "mgmtd.log");
-  ASSERT_TRUE(MenuTest::Shown(console, "<3> Config"));
+  ASSERT_TRUE(MenuTest::Settled(console, "<3> Config"));
   console.Key("Down");
   console.WaitQuiet();
   EXPECT_EQ(PagerRunFor(console, '1', kNothingStarts), "");
@@ -93,13 +93,13 @@ TEST(LogScreenTest, PagerRefusesShellCommandsAndTheMenuComesBack) {
   ASSERT_TRUE(SelectEntry(console, "View System Logs"));
   const termios menuAttributes = *console.TerminalAttributes();
   console.Type("1");
-  ASSERT_TRUE(MenuTest::Shown(console, "first line of the host log"));
+  ASSERT_TRUE(MenuTest::Settled(console, "first line of the host log"));
   EXPECT_TRUE(console.WaitForText("<Q> Quit </> RegExp Search <H> Help"));
   EXPECT_FALSE(console.Contains("System Customization"));
   console.Type("!");
   EXPECT_TRUE(console.WaitForText("Command not available"));
   console.Type("q");
-  ASSERT_TRUE(MenuTest::Shown(console, "System Customization"));
+  ASSERT_TRUE(MenuTest::Settled(console, "System Customization"));
   EXPECT_TRUE(console.WaitForText("<1> Syslog"));
   EXPECT_FALSE(console.Contains("first line of the host log"));
   const termios restored = *console.TerminalAttributes();

@@ -68,7 +68,7 @@ TEST(MenuDialogScreenTest, LockdownToggleRoundTrip) {
   };
   for (const Step& step : steps) {
     console.Key("Enter");
-    ASSERT_TRUE(MenuTest::Shown(console, step.before));
+    ASSERT_TRUE(MenuTest::Settled(console, step.before));
     EXPECT_TRUE(console.WaitForText("When enabled, lockdown mode prevents users"));
     console.Key("Space");
     console.Key(step.key);
@@ -86,7 +86,7 @@ TEST(MenuDialogScreenTest, KeyboardLayoutChangeReachesTheHost) {
   TestConsole console(options);
   ASSERT_TRUE(SelectEntry(console, "Configure Keyboard"));
   console.Key("Enter");
-  ASSERT_TRUE(MenuTest::Shown(console, "(o) US Default"));
+  ASSERT_TRUE(MenuTest::Settled(console, "(o) US Default"));
   EXPECT_TRUE(console.WaitForText("If you are having difficulty using your keyboard"));
   console.Key("Up");
   console.Key("Esc");
@@ -94,7 +94,7 @@ TEST(MenuDialogScreenTest, KeyboardLayoutChangeReachesTheHost) {
   EXPECT_EQ(HostState(console)["system"]["keyboardLayout"], "US Default");
 
   console.Key("Enter");
-  ASSERT_TRUE(MenuTest::Shown(console, "(o) US Default"));
+  ASSERT_TRUE(MenuTest::Settled(console, "(o) US Default"));
   console.Key("Down");
   console.Key("Enter");
   ASSERT_TRUE(MenuTest::Gone(console, "If you are having difficulty"));
@@ -110,7 +110,7 @@ TEST(MenuDialogScreenTest, FailedResetIsReportedAfterTheEventAndLogLine) {
   TestConsole console(DriverOptions(host));
   ASSERT_TRUE(SelectEntry(console, "Reset System Configuration"));
   console.Key("Enter");
-  ASSERT_TRUE(MenuTest::Shown(console, "Reset System Configuration now?"));
+  ASSERT_TRUE(MenuTest::Settled(console, "Reset System Configuration now?"));
   EXPECT_TRUE(console.WaitForText("Reset System Configuration: Confirm"));
   console.Key("Enter");
   console.WaitQuiet(300ms);
@@ -118,7 +118,7 @@ TEST(MenuDialogScreenTest, FailedResetIsReportedAfterTheEventAndLogLine) {
   EXPECT_FALSE(console.WaitForLog("Restoring factory defaults", 100ms));
 
   console.Key("F11");
-  ASSERT_TRUE(MenuTest::Shown(console, "Please wait while the default settings are restored."));
+  ASSERT_TRUE(MenuTest::Settled(console, "Please wait while the default settings are restored."));
   ASSERT_TRUE(MenuTest::WaitUntil(
       console, [&] { return Ran(console, "firmwareConfig.py --reset-only"); }, "the reset"));
   const auto events = TulkTest::SimRecords(console.Root(), "events.jsonl");
@@ -127,7 +127,7 @@ TEST(MenuDialogScreenTest, FailedResetIsReportedAfterTheEventAndLogLine) {
   EXPECT_EQ(events[0]["text"], "Restoring factory defaults");
   EXPECT_TRUE(console.WaitForLog("<14>Restoring factory defaults", 0ms));
 
-  ASSERT_TRUE(MenuTest::Shown(console, "Failed to reset system configuration."));
+  ASSERT_TRUE(MenuTest::Settled(console, "Failed to reset system configuration."));
   EXPECT_TRUE(console.WaitForText("Reset System Configuration: Error"));
   EXPECT_FALSE(Ran(console, "reboot -f"));
   console.Key("Enter");
@@ -138,9 +138,9 @@ TEST(MenuDialogScreenTest, SuccessfulResetRestartsOnEnterAndWaitsWithoutCpu) {
   Json host = DemoHostState();
   host["lockdown"]["enabled"] = true;
   TestConsole console(DriverOptions(host, "restore"));
-  ASSERT_TRUE(MenuTest::Shown(console, "Reset System Configuration now?"));
+  ASSERT_TRUE(MenuTest::Settled(console, "Reset System Configuration now?"));
   console.Key("F11");
-  ASSERT_TRUE(MenuTest::Shown(console, "Default settings are restored."));
+  ASSERT_TRUE(MenuTest::Settled(console, "Default settings are restored."));
   EXPECT_TRUE(console.WaitForText("<Enter> Restart Host"));
   EXPECT_EQ(HostState(console)["lockdown"]["enabled"], false);
   console.Key("Esc");

@@ -70,7 +70,7 @@ TEST(MenuScreenTest, HostStateGreysEntriesAndSelectionSkipsThem) {
     Json host = DemoHostState();
     c.change(host);
     TestConsole console(DriverOptions(host));
-    ASSERT_TRUE(MenuTest::Shown(console, "System Customization"));
+    ASSERT_TRUE(MenuTest::Settled(console, "System Customization"));
     for (const std::string& label : c.greyed) {
       const int row = RowOf(console, label);
       ASSERT_GE(row, 0) << label << "\n" << console.Dump();
@@ -86,14 +86,14 @@ TEST(MenuScreenTest, HostStateGreysEntriesAndSelectionSkipsThem) {
 TEST(MenuScreenTest, KeyboardEntryOnlyOnLocalConsole) {
   TulkTest::Options remote = DriverOptions();
   TestConsole console(remote);
-  ASSERT_TRUE(MenuTest::Shown(console, "System Customization"));
+  ASSERT_TRUE(MenuTest::Settled(console, "System Customization"));
   EXPECT_EQ(RowOf(console, "Configure Keyboard"), -1);
   EXPECT_EQ(RowOf(console, "Troubleshooting Options"), kMenuTop + 8);
 
   TulkTest::Options local = DriverOptions();
   local.term = "xterm";
   TestConsole localConsole(local);
-  ASSERT_TRUE(MenuTest::Shown(localConsole, "System Customization"));
+  ASSERT_TRUE(MenuTest::Settled(localConsole, "System Customization"));
   EXPECT_EQ(RowOf(localConsole, "Configure Keyboard"), kMenuTop + 8);
   EXPECT_EQ(RowOf(localConsole, "Troubleshooting Options"), kMenuTop + 9);
 }
@@ -105,7 +105,7 @@ TEST(MenuScreenTest, EveryEntryDescribesItselfWithItsFooter) {
   options.term = "xterm";
   options.env["TULK_MENU_EMPTY_PASSWORD"] = "1";
   TestConsole console(options);
-  ASSERT_TRUE(MenuTest::Shown(console, "System Customization"));
+  ASSERT_TRUE(MenuTest::Settled(console, "System Customization"));
   struct Entry {
     const char* title;
     const char* text;
@@ -216,7 +216,7 @@ TEST(MenuScreenTest, RegisteredScreensOpenAndAVanishedInterfaceIsReported) {
   TestConsole console(options);
   ASSERT_TRUE(SelectEntry(console, "Configure Management Network"));
   console.Key("Enter");
-  ASSERT_TRUE(MenuTest::Shown(console, "Opened ManagementNetwork"));
+  ASSERT_TRUE(MenuTest::Settled(console, "Opened ManagementNetwork"));
   console.Key("Enter");
   ASSERT_TRUE(MenuTest::Gone(console, "Opened ManagementNetwork"));
 
@@ -266,7 +266,7 @@ TEST(MenuScreenTest, ReloadSignalReadsTheHostAgainAndKeepsTheSelection) {
 // full repaint of the screen (over 2,000 bytes).
 TEST(MenuScreenTest, OneDownFitsASlowSerialLine) {
   TestConsole console(DriverOptions());
-  ASSERT_TRUE(MenuTest::Shown(console, "System Customization"));
+  ASSERT_TRUE(MenuTest::Settled(console, "System Customization"));
   for (int step = 0; step < 9; ++step) {  // to the last entry
     const std::size_t before = console.BytesReceived();
     const std::string from = RightTitle(console);

@@ -15,18 +15,6 @@ TulkTest::Options DriverOptions(const nlohmann::json& host, const std::string& s
   return options;
 }
 
-::testing::AssertionResult Shown(TulkTest::TestConsole& console, const std::string& text) {
-  ::testing::AssertionResult shown = console.WaitForText(text);
-  console.WaitQuiet();
-  return shown;
-}
-
-::testing::AssertionResult Gone(TulkTest::TestConsole& console, const std::string& text) {
-  ::testing::AssertionResult gone = console.WaitForTextGone(text);
-  console.WaitQuiet();
-  return gone;
-}
-
 std::string RightTitle(const TulkTest::TestConsole& console, int cols) {
   std::string text;
   for (int col = cols / 2 + 2; col < cols - 1; ++col) {
@@ -37,8 +25,7 @@ std::string RightTitle(const TulkTest::TestConsole& console, int cols) {
 
 ::testing::AssertionResult SelectEntry(TulkTest::TestConsole& console, const std::string& title,
                                        int cols) {
-  console.WaitForText("System Customization");
-  console.WaitQuiet();
+  Settled(console, "System Customization");
   for (int step = 0; step < 20; ++step) {
     // Read the title only once the move has been drawn completely: a title
     // read half-way through an update matches neither entry.

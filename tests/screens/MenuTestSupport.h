@@ -22,11 +22,10 @@ TulkTest::Options DriverOptions(const nlohmann::json& host = TulkTest::DemoHostS
 /// Waits until a condition holds (ScreenTestSupport.h).
 using TulkTest::WaitUntil;
 
-/// Waits for `text` to appear (or, for Gone, to disappear), then until the
-/// console is quiet: a frame discards the keys typed while it is drawn, so
-/// tests wait for the drawing to end before they type.
-::testing::AssertionResult Shown(TulkTest::TestConsole& console, const std::string& text);
-::testing::AssertionResult Gone(TulkTest::TestConsole& console, const std::string& text);
+/// Waits for text to appear or disappear and the screen to settle
+/// (ScreenTestSupport.h).
+using TulkTest::Gone;
+using TulkTest::Settled;
 
 /// The right pane's title (row 1, from the middle of the screen), trimmed.
 std::string RightTitle(const TulkTest::TestConsole& console, int cols = 80);

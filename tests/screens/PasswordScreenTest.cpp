@@ -50,6 +50,22 @@ std::vector<json> PasswordAudits(const TestConsole& console) {
   return RecordsWhere(console, "audit.jsonl", "event", "account.changePassword");
 }
 
+// Types the old password, then `next` and `confirm` into the two new fields,
+// and submits them.
+::testing::AssertionResult SubmitPasswords(TestConsole& console, const std::string& next,
+                                           const std::string& confirm) {
+  console.Type(SessionTest::kRootPassword);
+  console.Key("Down");
+  if (auto moved = CursorOn(console, "New Password:"); !moved) {
+    return moved;
+  }
+  console.Type(next);
+  console.Key("Down");
+  console.Type(confirm);
+  console.Key("Enter");
+  return ::testing::AssertionSuccess();
+}
+
 TEST(PasswordScreenTest, WrongOldPasswordNeverReachesTheNewField) {
   TestConsole console(ConsoleOptions());
   ASSERT_TRUE(OpenPasswordDialog(console));
@@ -76,13 +92,7 @@ TEST(PasswordScreenTest, WrongOldPasswordNeverReachesTheNewField) {
 TEST(PasswordScreenTest, MismatchAndEmptyAreRefusedBeforePam) {
   TestConsole console(ConsoleOptions());
   ASSERT_TRUE(OpenPasswordDialog(console));
-  console.Type(SessionTest::kRootPassword);
-  console.Key("Down");
-  ASSERT_TRUE(CursorOn(console, "New Password:"));
-  console.Type("first");
-  console.Key("Down");
-  console.Type("second");
-  console.Key("Enter");
+  ASSERT_TRUE(SubmitPasswords(console, "first", "second"));
   ASSERT_TRUE(Settled(console, "The new password and the confirmed password do not"));
   console.Key("Enter");
   ASSERT_TRUE(CursorOn(console, "New Password:"));
@@ -154,13 +164,7 @@ TEST(PasswordScreenTest, PamRefusingTheChangeIsReported) {
   pam.policy = {"root:chauthtok-fails"};
   TestConsole console(ConsoleOptions(TulkTest::DemoHostState(), pam));
   ASSERT_TRUE(OpenPasswordDialog(console));
-  console.Type(SessionTest::kRootPassword);
-  console.Key("Down");
-  ASSERT_TRUE(CursorOn(console, "New Password:"));
-  console.Type("weak");
-  console.Key("Down");
-  console.Type("weak");
-  console.Key("Enter");
+  ASSERT_TRUE(SubmitPasswords(console, "weak", "weak"));
   ASSERT_TRUE(Settled(console, "The password change operation failed."));
   const auto audits = PasswordAudits(console);
   ASSERT_EQ(audits.size(), 1u);
@@ -177,13 +181,7 @@ TEST(PasswordScreenTest, FailedStoreStillChangesAndWarns) {
   host["faults"]["HostMgr::Authentication::StoreUserAccountsToCs"] = "store is read-only";
   TestConsole console(ConsoleOptions(host));
   ASSERT_TRUE(OpenPasswordDialog(console));
-  console.Type(SessionTest::kRootPassword);
-  console.Key("Down");
-  ASSERT_TRUE(CursorOn(console, "New Password:"));
-  console.Type("next-2");
-  console.Key("Down");
-  console.Type("next-2");
-  console.Key("Enter");
+  ASSERT_TRUE(SubmitPasswords(console, "next-2", "next-2"));
   ASSERT_TRUE(Settled(console, "Configure Password: Warning"));
   EXPECT_TRUE(console.Contains("Error while storing user account information to"));
   EXPECT_EQ(CountLog(console, "<11>Error persisting changes to config store"), 1);

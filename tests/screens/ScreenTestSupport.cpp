@@ -47,4 +47,16 @@ void WriteRootFile(const std::filesystem::path& root, const std::string& path,
   return ::testing::AssertionSuccess();
 }
 
+::testing::AssertionResult Settled(TestConsole& console, const std::string& text) {
+  auto shown = console.WaitForText(text);
+  console.WaitQuiet();
+  return shown;
+}
+
+::testing::AssertionResult Gone(TestConsole& console, const std::string& text) {
+  auto gone = console.WaitForTextGone(text);
+  console.WaitQuiet();
+  return gone;
+}
+
 }  // namespace TulkTest

@@ -43,4 +43,10 @@ void WriteRootFile(const std::filesystem::path& root, const std::string& path,
                                      const std::string& what,
                                      std::chrono::milliseconds timeout = std::chrono::seconds(5));
 
+/// Waits for `text` to appear (or, for Gone, to disappear), then until the
+/// console has been quiet for a moment: one update can reach the terminal in
+/// several reads, and what lies below `text` may still be on its way.
+::testing::AssertionResult Settled(TestConsole& console, const std::string& text);
+::testing::AssertionResult Gone(TestConsole& console, const std::string& text);
+
 }  // namespace TulkTest

@@ -42,18 +42,6 @@ std::filesystem::path PasswordFile(const TulkTest::TestConsole& console) {
   return ::testing::AssertionSuccess();
 }
 
-::testing::AssertionResult Settled(TulkTest::TestConsole& console, const std::string& text) {
-  auto shown = console.WaitForText(text);
-  console.WaitQuiet();
-  return shown;
-}
-
-::testing::AssertionResult Gone(TulkTest::TestConsole& console, const std::string& text) {
-  auto gone = console.WaitForTextGone(text);
-  console.WaitQuiet();
-  return gone;
-}
-
 std::vector<nlohmann::json> RecordsWhere(const TulkTest::TestConsole& console,
                                          const std::string& file, const std::string& key,
                                          const std::string& value) {

@@ -50,11 +50,10 @@ std::filesystem::path PasswordFile(const TulkTest::TestConsole& console);
                                  const std::string& password = kRootPassword,
                                  const std::string& key = "F2");
 
-/// Waits for `text` to appear (or, for Gone, to disappear), then until the
-/// console has been quiet for a moment. Every full draw of a frame discards
-/// typed-ahead keys, so a key is sent only once the screen has settled.
-::testing::AssertionResult Settled(TulkTest::TestConsole& console, const std::string& text);
-::testing::AssertionResult Gone(TulkTest::TestConsole& console, const std::string& text);
+/// Waits for text to appear or disappear and the screen to settle
+/// (ScreenTestSupport.h).
+using TulkTest::Gone;
+using TulkTest::Settled;
 
 /// Waits until a condition holds (ScreenTestSupport.h).
 using TulkTest::WaitUntil;
