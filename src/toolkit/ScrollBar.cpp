@@ -16,23 +16,12 @@ int ScrollBar::BlockRowFor(int top, int items, int rows) {
 
 void ScrollBar::Show(int top, int items, int rows) {
   blockRow_ = BlockRowFor(top, items, rows);
-  Repaint();
+  RepaintContents();
 }
 
 void ScrollBar::Hide() {
   blockRow_.reset();
-  Repaint();
-}
-
-void ScrollBar::Repaint() {
-  if (Curses() == nullptr) {
-    return;
-  }
-  DrawBatch batch;
-  ApplyBackground(Active());
-  werase(Curses());
-  PaintContents(Active());
-  Update();
+  RepaintContents();
 }
 
 void ScrollBar::PaintContents(bool /*active*/) {

@@ -31,8 +31,6 @@ class ScrollBar : public Window {
   void PaintContents(bool active) override;
 
  private:
-  void Repaint();
-
   std::optional<int> blockRow_;
 };
 

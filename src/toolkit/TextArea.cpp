@@ -12,14 +12,7 @@ TextArea::TextArea(Window* parent, int column, int row, int width, int height, i
 
 void TextArea::SetText(std::string_view text) {
   text_ = text;
-  if (Curses() == nullptr) {
-    return;
-  }
-  DrawBatch batch;
-  ApplyBackground(Active());
-  werase(Curses());
-  PaintContents(Active());
-  Update();
+  RepaintContents();
 }
 
 void TextArea::Append(std::string_view text) {

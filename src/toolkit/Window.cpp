@@ -157,6 +157,17 @@ void Window::Redraw(bool active) {
 void Window::PaintContents(bool /*active*/) {
 }
 
+void Window::RepaintContents() {
+  if (window_ == nullptr) {
+    return;
+  }
+  DrawBatch batch;
+  ApplyBackground(active_);
+  werase(window_);
+  PaintContents(active_);
+  Update();
+}
+
 void Window::SetColors(int background, int foreground) {
   if (background != -1) {
     background_ = background;

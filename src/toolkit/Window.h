@@ -136,6 +136,9 @@ class Window {
   /// kept texts were drawn, before the children are drawn. The box and
   /// lines are drawn last, above the children.
   virtual void PaintContents(bool active);
+  /// Erases the window and paints its contents again in its current state
+  /// (for windows whose contents change between full draws).
+  void RepaintContents();
 
   /// Sets the curses background for the current state (active or dimmed)
   /// and makes it the drawing attribute.
