@@ -4,7 +4,6 @@
 
 #include <signal.h>
 
-#include <fstream>
 #include <ostream>
 
 #include "SessionTestSupport.h"
@@ -21,11 +20,6 @@ using SessionTest::Settled;
 using SessionTest::WaitUntil;
 using TulkTest::DemoHostState;
 using TulkTest::TestConsole;
-
-std::string ReadFile(const std::filesystem::path& path) {
-  std::ifstream in(path);
-  return std::string(std::istreambuf_iterator<char>(in), {});
-}
 
 TEST(LoginScreenTest, NamePasswordModeAndEscLeavesNoTrace) {
   TestConsole console(ConsoleOptions());
@@ -184,7 +178,8 @@ TEST(LoginScreenTest, ExpiredPasswordIsChangedThenLoginAgain) {
   ASSERT_TRUE(Gone(console, "Confirm Password:"));
   ASSERT_TRUE(Settled(console, "Authentication Required"));
   EXPECT_FALSE(console.Contains("System Customization"));
-  EXPECT_NE(ReadFile(SessionTest::PasswordFile(console)).find("root:fresh-1:"), std::string::npos);
+  EXPECT_NE(TulkTest::ReadText(SessionTest::PasswordFile(console)).find("root:fresh-1:"),
+            std::string::npos);
 
   console.Type("fresh-1");
   console.Key("Enter");
@@ -222,9 +217,7 @@ TEST(LoginScreenTest, SmartCardLoginAndRemoval) {
   ASSERT_TRUE(Settled(console, "Old Password:"));
 
   host["smartCards"][0]["valid"] = false;
-  const std::filesystem::path state = console.HostStatePath();
-  std::ofstream(state.string() + ".new") << host.dump();
-  std::filesystem::rename(state.string() + ".new", state);
+  TulkTest::ReplaceHostState(console, host);
   console.Signal(SIGUSR1);
   ASSERT_TRUE(console.WaitForLog("Logging out user id 'cardholder'"));
   EXPECT_EQ(console.WaitExit(), 0);

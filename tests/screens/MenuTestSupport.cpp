@@ -1,8 +1,6 @@
 #include "MenuTestSupport.h"
 
 #include <cstdio>
-#include <fstream>
-#include <sstream>
 #include <thread>
 
 namespace MenuTest {
@@ -43,19 +41,6 @@ std::string RightTitle(const TulkTest::TestConsole& console, int cols) {
     }
   }
   return ::testing::AssertionFailure() << "no entry " << title << "\n" << console.Dump();
-}
-
-void ReplaceHostState(const TulkTest::TestConsole& console, const nlohmann::json& host) {
-  const std::filesystem::path fresh = console.HostStatePath().string() + ".new";
-  std::ofstream(fresh) << host.dump();
-  std::filesystem::rename(fresh, console.HostStatePath());
-}
-
-std::string ReadText(const std::filesystem::path& path) {
-  std::ifstream in(path);
-  std::stringstream text;
-  text << in.rdbuf();
-  return text.str();
 }
 
 std::string Capture(const std::string& commandLine) {

@@ -34,12 +34,11 @@ std::string RightTitle(const TulkTest::TestConsole& console, int cols = 80);
 ::testing::AssertionResult SelectEntry(TulkTest::TestConsole& console, const std::string& title,
                                        int cols = 80);
 
-/// Replaces the console's host state file atomically (the console and the
-/// simulated tools then read the new state).
-void ReplaceHostState(const TulkTest::TestConsole& console, const nlohmann::json& host);
+/// Replaces the host state file (ScreenTestSupport.h).
+using TulkTest::ReplaceHostState;
 
-/// The whole text of a file (empty when missing).
-std::string ReadText(const std::filesystem::path& path);
+/// The whole text of a file (ScreenTestSupport.h).
+using TulkTest::ReadText;
 
 /// Runs a shell command line and returns its standard output.
 std::string Capture(const std::string& commandLine);

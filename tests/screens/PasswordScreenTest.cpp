@@ -2,7 +2,6 @@
 // Customization menu, through the real PAM library.
 
 #include <algorithm>
-#include <fstream>
 
 #include "SessionTestSupport.h"
 
@@ -22,8 +21,7 @@ using TulkTest::TestConsole;
 constexpr char kDialogText[] = "Setting the password will prevent unauthorized access";
 
 std::string PasswordFile(const TestConsole& console) {
-  std::ifstream in(SessionTest::PasswordFile(console));
-  return std::string(std::istreambuf_iterator<char>(in), {});
+  return TulkTest::ReadText(SessionTest::PasswordFile(console));
 }
 
 ::testing::AssertionResult OpenPasswordDialog(TestConsole& console) {

@@ -1,6 +1,7 @@
 #include "ScreenTestSupport.h"
 
 #include <fstream>
+#include <iterator>
 
 #include "platform/sim/DemoHost.h"
 
@@ -45,6 +46,17 @@ void WriteRootFile(const std::filesystem::path& root, const std::string& path,
     console.Pump(std::chrono::milliseconds(20));
   }
   return ::testing::AssertionSuccess();
+}
+
+std::string ReadText(const std::filesystem::path& path) {
+  std::ifstream in(path);
+  return std::string(std::istreambuf_iterator<char>(in), {});
+}
+
+void ReplaceHostState(const TestConsole& console, const nlohmann::json& host) {
+  const std::filesystem::path fresh = console.HostStatePath().string() + ".new";
+  std::ofstream(fresh) << host.dump();
+  std::filesystem::rename(fresh, console.HostStatePath());
 }
 
 ::testing::AssertionResult Settled(TestConsole& console, const std::string& text) {

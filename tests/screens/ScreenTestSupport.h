@@ -37,6 +37,14 @@ nlohmann::json ReadHostState(const std::filesystem::path& stateFile);
 void WriteRootFile(const std::filesystem::path& root, const std::string& path,
                    const std::string& text = "");
 
+/// The whole text of a file (empty when missing).
+std::string ReadText(const std::filesystem::path& path);
+
+/// Replaces the console's host state file as a whole and atomically, as
+/// another process would: the console and the simulated tools then read
+/// the new state.
+void ReplaceHostState(const TestConsole& console, const nlohmann::json& host);
+
 /// Waits until `condition` holds, pumping the console's output meanwhile;
 /// the failure names `what` and dumps the screen.
 ::testing::AssertionResult WaitUntil(TestConsole& console, const std::function<bool()>& condition,

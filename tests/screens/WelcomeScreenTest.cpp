@@ -4,8 +4,6 @@
 
 #include <signal.h>
 
-#include <fstream>
-
 #include "SessionTestSupport.h"
 #include "include/ColorNumbers.h"
 
@@ -41,14 +39,6 @@ std::vector<json> Ipv6Networks(int count) {
                         {"scope", 3}});
   }
   return networks;
-}
-
-// Replaces the state file as a whole, so that the console re-reads it.
-void ReplaceHostState(const TestConsole& console, const json& host) {
-  const std::filesystem::path path = console.HostStatePath();
-  const std::filesystem::path temporary = path.string() + ".new";
-  std::ofstream(temporary) << host.dump();
-  std::filesystem::rename(temporary, path);
 }
 
 TEST(WelcomeScreenTest, ShowsTheDemoHostInTwoPanels) {
@@ -188,7 +178,7 @@ TEST(WelcomeScreenTest, CustomMessageAndBackOnReload) {
 
   host["system"]["welcomeMessage"] = "";
   host["network"]["dns"]["hostname"] = "tavi-77";
-  ReplaceHostState(console, host);
+  TulkTest::ReplaceHostState(console, host);
   console.Signal(SIGUSR1);
   ASSERT_TRUE(Settled(console, "https://tavi-77/"));
   EXPECT_FALSE(console.Contains("Lab host"));
