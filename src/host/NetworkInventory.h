@@ -13,8 +13,8 @@
 
 #include "host/PnicRow.h"
 #include "host/SwitchSummary.h"
-#include "toolkit/HykNicInfo.h"
-#include "toolkit/PortGroupInfo.h"
+#include "host/HykNicInfo.h"
+#include "host/PortGroupInfo.h"
 
 namespace Tulk {
 

@@ -15,6 +15,7 @@
 #include "runtime/RuntimeFrame.h"
 #include "runtime/SignalThread.h"
 #include "runtime/SystemLog.h"
+#include "runtime/WorkerResult.h"
 
 namespace Tulk {
 namespace {
@@ -53,16 +54,17 @@ timeval Until(const timeval& now, const timeval& until) {
 
 }  // namespace
 
-int PollInput(const timeval* limit) {
+int PollInput(const timeval* limit, int wakeFd) {
   if (g_cursesMayHoldInput) {
     int key = ReadKeyNow();
     if (key != ERR) {
       return key;
     }
   }
-  pollfd fds[2] = {{0, POLLIN, 0}, {SignalPipeReadFd(), POLLIN, 0}};
+  pollfd fds[3] = {{0, POLLIN, 0}, {SignalPipeReadFd(), POLLIN, 0}, {wakeFd, POLLIN, 0}};
+  const nfds_t count = wakeFd >= 0 ? 3 : 2;
   int millis = limit == nullptr ? -1 : Clock::RealMilliseconds(limit->tv_sec, limit->tv_usec);
-  int ready = poll(fds, 2, millis);
+  int ready = poll(fds, count, millis);
   if (ready < 0) {
     LogErrno("poll() failed");
     return kPollOther;
@@ -82,19 +84,41 @@ int PollInput(const timeval* limit) {
     if (got == 1 && code >= 1 && code <= 4) {
       return -2 - code;
     }
+    return kPollOther;
+  }
+  if (count == 3 && (fds[2].revents & (POLLIN | POLLHUP | POLLERR)) != 0) {
+    return kPollWoken;
   }
   return kPollOther;
 }
 
-int WaitForKey(RuntimeFrame* frame, bool idleTimeout) {
+namespace {
+
+// A worker's result is not a key: the wait that it ended is resumed by the
+// frame's next wait, with the same start (dimming point, idle deadline) and
+// dimmed state.
+struct ResumedWait {
+  RuntimeFrame* frame = nullptr;
+  timeval start{};
+  bool dimmed = false;
+};
+std::optional<ResumedWait> g_resumedWait;
+
+int WaitFor(RuntimeFrame* frame, bool idleTimeout, const WorkerResult* workerResult) {
   const bool timeoutActive = idleTimeout && g_idleTimeoutSeconds != 0;
-  const timeval start = Clock::Now();
+  timeval start = Clock::Now();
+  bool dimmed = false;
+  if (g_resumedWait && g_resumedWait->frame == frame) {
+    start = g_resumedWait->start;
+    dimmed = g_resumedWait->dimmed;
+  }
+  g_resumedWait.reset();
   timeval dimPoint = start;
   dimPoint.tv_sec += kDimSeconds;
   timeval deadline = start;
   deadline.tv_sec +=
       g_idleTimeoutSeconds > kDimSeconds ? static_cast<long>(g_idleTimeoutSeconds) : kDimSeconds;
-  bool dimmed = false;
+  const int wakeFd = workerResult != nullptr ? workerResult->WakeFd() : -1;
 
   for (;;) {
     const timeval now = Clock::Now();
@@ -102,10 +126,14 @@ int WaitForKey(RuntimeFrame* frame, bool idleTimeout) {
       currentWindow = nullptr;
       throw TulkTimeout{};
     }
+    if (workerResult != nullptr && workerResult->Ready()) {
+      g_resumedWait = ResumedWait{frame, start, dimmed};
+      return kKeyResultReady;
+    }
     int result;
     if (!dimmed && !IsLater(now, dimPoint)) {
       timeval left = Until(now, dimPoint);
-      result = PollInput(&left);
+      result = PollInput(&left, wakeFd);
     } else {
       if (!dimmed) {
         if (frame != nullptr) {
@@ -118,14 +146,15 @@ int WaitForKey(RuntimeFrame* frame, bool idleTimeout) {
         if (left.tv_sec < 0) {
           left = timeval{0, 0};
         }
-        result = PollInput(&left);
+        result = PollInput(&left, wakeFd);
       } else {
-        result = PollInput(nullptr);
+        result = PollInput(nullptr, wakeFd);
       }
     }
 
     switch (result) {
       case kPollTimeLimit:
+      case kPollWoken:
         continue;
       case kPollReload:
         if (currentWindow != nullptr) {
@@ -162,6 +191,16 @@ int WaitForKey(RuntimeFrame* frame, bool idleTimeout) {
     }
     return result;
   }
+}
+
+}  // namespace
+
+int WaitForKey(RuntimeFrame* frame, bool idleTimeout) {
+  return WaitFor(frame, idleTimeout, nullptr);
+}
+
+int WaitForKeyOrResult(RuntimeFrame* frame, bool idleTimeout, const WorkerResult& result) {
+  return WaitFor(frame, idleTimeout, &result);
 }
 
 void HandleResize() {

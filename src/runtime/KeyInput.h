@@ -13,6 +13,7 @@
 namespace Tulk {
 
 class RuntimeFrame;
+class WorkerResult;
 
 /// Thrown when a logged-in session has been idle for the configured
 /// timeout. It has no data and no base class; RunFrame() lets it through
@@ -26,14 +27,20 @@ inline constexpr int kPollReload = -3;     // SIGUSR1
 inline constexpr int kPollExitAfter = -4;  // SIGUSR2
 inline constexpr int kPollResize = -5;     // SIGWINCH
 inline constexpr int kPollTerminate = -6;  // SIGINT, SIGQUIT, SIGTERM
+inline constexpr int kPollWoken = -7;      // the wake descriptor is readable
+
+/// WaitForKeyOrResult(): the worker's result is set.
+inline constexpr int kKeyResultReady = kPollWoken;
 
 /// Seconds without a key after which the screen is dimmed.
 inline constexpr long kDimSeconds = 60;
 
 /// Waits for a key on standard input or a byte on the signal pipe, at most
 /// for `limit` (null: without limit). Returns the curses key code, or one
-/// of the kPoll* values.
-int PollInput(const timeval* limit);
+/// of the kPoll* values. With `wakeFd` >= 0 it also returns kPollWoken when
+/// that descriptor is readable (a key or a signal byte that is ready too
+/// comes first); the byte is left for its owner.
+int PollInput(const timeval* limit, int wakeFd = -1);
 
 /// Returns the next key for `frame`. With `idleTimeout` true and a
 /// configured timeout, throws TulkTimeout after that many seconds without a
@@ -41,6 +48,13 @@ int PollInput(const timeval* limit);
 /// wakes it is delivered. Ends the process with exit(0) on SIGUSR2 outside
 /// a session, on a resize and on SIGINT, SIGQUIT or SIGTERM.
 int WaitForKey(RuntimeFrame* frame, bool idleTimeout);
+
+/// WaitForKey(), but it also returns kKeyResultReady as soon as `result`
+/// is set by its worker (at once when it is set already). Dimming, the idle
+/// timeout and the signals work as in WaitForKey() while the worker runs:
+/// this is how a screen waits for a background check and for Esc at the
+/// same time, without polling.
+int WaitForKeyOrResult(RuntimeFrame* frame, bool idleTimeout, const WorkerResult& result);
 
 /// Applies the terminal's new size to curses and logs it.
 void HandleResize();

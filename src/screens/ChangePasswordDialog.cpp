@@ -57,7 +57,7 @@ ChangePasswordDialog::ChangePasswordDialog(Frame* owner, std::string user)
   list_->SetItems({&oldPassword_, &newPassword_, &confirmPassword_});
   SetTitle(Text(kTitle));
   SetText(Text(kMessage));
-  SetFooter(kOkCancelFooter);
+  SetFooter(Footer::kOkCancel);
 }
 
 void ChangePasswordDialog::Select(Field field) {

@@ -2,21 +2,20 @@
 
 #include <curses.h>
 
+#include <utility>
+
 #include "host/HostTools.h"
 #include "host/ManagementNetwork.h"
-#include "include/Keys.h"
 #include "include/ProcessFlags.h"
-#include "runtime/KeyInput.h"
+#include "render/TextId.h"
 #include "screens/ChangePasswordDialog.h"
 #include "screens/KeyboardDialog.h"
 #include "screens/LockdownDialog.h"
 #include "screens/LogPager.h"
 #include "screens/ManagementNetworkView.h"
 #include "screens/RestoreDialog.h"
-#include "screens/ScreenRegistry.h"
 #include "screens/SupportPages.h"
-#include "toolkit/ItemList.h"
-#include "toolkit/LabelItem.h"
+#include "toolkit/Footer.h"
 #include "toolkit/MessageDialog.h"
 #include "toolkit/RunFrame.h"
 #include "toolkit/TextArea.h"
@@ -25,32 +24,31 @@ namespace Tulk {
 namespace {
 
 constexpr char kLockdownQuery[] = "osksvc/auth/lockdown_is_enabled";
+constexpr char kLogOut[] = "Log Out";
 
-// The right-hand footers. The lockdown footer lacks the "{/color}" after
-// "<Enter>" that the password footer has; both are kept as they are.
-constexpr char kPasswordFooter[] =
-    "{color:white}<Enter>{/color}{color:light-grey} Change{/color}{align:right}"
-    "{color:white}<Esc>{/color}{color:light-grey} Log Out{/color}{/align}";
-constexpr char kLockdownFooter[] =
-    "{color:white}<Enter>{color:light-grey} Change{/color}{align:right}"
-    "{color:white}<Esc>{/color}{color:light-grey} Log Out{/color}{/align}";
-constexpr char kMoreFooter[] =
-    "{color:white}<Enter>{/color}{color:light-grey} More{/color}{align:right}"
-    "{color:white}<Esc>{/color}{color:light-grey} Log Out{/color}{/align}";
-constexpr char kRestartFooter[] =
-    "{color:white}<Enter>{/color}{color:light-grey} Restart{/color}{align:right}"
-    "{color:white}<Esc>{/color}{color:light-grey} Log Out{/color}{/align}";
-constexpr char kRunTestFooter[] =
-    "{color:white}<Enter>{/color}{color:light-grey} Run Test{/color}{align:right}"
-    "{color:white}<Esc>{/color}{color:light-grey} Log Out{/color}{/align}";
-constexpr char kResetFooter[] =
-    "{color:white}<Enter>{/color}{color:light-grey} Reset{/color}{align:right}"
-    "{color:white}<Esc>{/color}{color:light-grey} Log Out{/color}{/align}";
-constexpr char kSupportFooter[] =
-    "{color:light-grey}<Page Up> <Page Down>{/color}{align:right}"
-    "{color:white}<Esc>{/color}{color:light-grey} Log Out{/color}{/align}";
-constexpr char kLogOutFooter[] =
-    "{align:right}{color:white}<Esc>{/color}{color:light-grey} Log Out{/color}{/align}";
+std::string EntryFooter(std::uint32_t id) {
+  switch (id) {
+    case kEntryPassword:
+      return Footer::MenuAction("Change", kLogOut);
+    case kEntryLockdown:
+      return Footer::kMenuLockdown;
+    case kEntryManagementNetwork:
+    case kEntryNetworkRestore:
+    case kEntryTroubleshooting:
+    case kEntryKeyboard:
+      return Footer::MenuAction("More", kLogOut);
+    case kEntryRestartNetwork:
+      return Footer::MenuAction("Restart", kLogOut);
+    case kEntryTestNetwork:
+      return Footer::MenuAction("Run Test", kLogOut);
+    case kEntrySupportInformation:
+      return Footer::kMenuSupportPages;
+    case kEntryResetConfiguration:
+      return Footer::MenuAction("Reset", kLogOut);
+    default:
+      return Footer::kMenuLogOut;
+  }
+}
 
 // Frames opened from the menu live on the stack, so that the idle timeout
 // unwinding through them deletes them too.
@@ -59,15 +57,17 @@ void ShowMessage(Frame* owner, std::uint32_t titleId, std::uint32_t textId) {
   RunFrame(&message);
 }
 
-template <typename DialogType>
-int RunDialog(Frame* owner) {
-  DialogType dialog(owner);
+template <typename DialogType, typename... Args>
+int RunDialog(Frame* owner, Args&&... args) {
+  DialogType dialog(owner, std::forward<Args>(args)...);
   return RunFrame(&dialog);
 }
 
 }  // namespace
 
-GeneralWindow::GeneralWindow(Frame* owner) : RootWindow(owner) {
+GeneralWindow::GeneralWindow(Frame* owner) : MenuWindow(owner) {
+  SetMenuTitle(Text(TextId::kSystemCustomization));
+  SetKeepSelection(true);
   ReadHostState();
   BuildEntries();
   supportPages_ = ReadSupportPages();
@@ -82,151 +82,78 @@ void GeneralWindow::ReadHostState() {
 }
 
 void GeneralWindow::BuildEntries() {
-  entryIds_.clear();
-  items_.clear();
-  for (const MenuEntry& entry : BuildMenuEntries(hostState_, localConsole)) {
-    entryIds_.push_back(entry.id);
-    auto item = std::make_unique<LabelItem>(EntryLabel(Text(entry.id), entry.enabled));
-    item->SetEnabled(entry.enabled);
-    items_.push_back(std::move(item));
+  std::vector<MenuEntry> entries;
+  for (const MenuRow& row : BuildMenuRows(hostState_, localConsole)) {
+    const std::uint32_t id = row.id;
+    MenuEntry entry;
+    entry.id = id;
+    entry.label = Text(id);
+    entry.enabled = row.enabled;
+    entry.describe = [this, id] { return Describe(id); };
+    entry.footer = EntryFooter(id);
+    entry.action = [this, id] { return Open(id); };
+    entries.push_back(std::move(entry));
   }
-  // The menu must never point at the items just replaced.
-  std::vector<Item*> items;
-  for (auto& item : items_) {
-    items.push_back(item.get());
-  }
-  Menu().SetItems(items);
+  SetEntries(std::move(entries));
 }
 
-void GeneralWindow::Populate() {
-  DrawBatch batch;
-  const std::uint32_t keep = selected_;
-  SetLeftTitle(Text(4));
-  SetLeftFooter(kSelectFooter);
-  Menu().SetItems(Menu().Items());
-  SelectId(keep);
-  selected_ = SelectedId();
-  Menu().Draw();
-  ShowDescription();
-}
-
-void GeneralWindow::SelectId(std::uint32_t id) {
-  for (std::size_t i = 0; i < entryIds_.size(); ++i) {
-    if (entryIds_[i] == id && items_[i]->Enabled()) {
-      Menu().SelectByOrdinal(static_cast<int>(i));
-      return;
-    }
-  }
-}
-
-std::uint32_t GeneralWindow::SelectedId() const {
-  const int index = Menu().CurrentIndex();
-  if (index < 0 || static_cast<std::size_t>(index) >= entryIds_.size()) {
-    return kEntrySeparator;
-  }
-  return entryIds_[static_cast<std::size_t>(index)];
-}
-
-void GeneralWindow::ShowDescription() {
-  DrawBatch batch;
-  const std::uint32_t id = SelectedId();
-  std::string text;
-  const char* footer = kLogOutFooter;
+std::string GeneralWindow::Describe(std::uint32_t id) {
   switch (id) {
     case kEntryPassword:
-      text = std::string("{color:white}") + Text(passwordWasEmpty ? 120 : 119) + "{/color}\n\n" +
-             Text(23);
-      footer = kPasswordFooter;
-      break;
+      return std::string("{color:white}") +
+             Text(passwordWasEmpty ? TextId::kNotSet : TextId::kSet) + "{/color}\n\n" +
+             Text(TextId::kPasswordDescription);
     case kEntryLockdown:
-      text = std::string("{color:white}") + Text(lockdownEnabled_ ? 121 : 122) + "{/color}\n\n" +
-             Text(24);
-      footer = kLockdownFooter;
-      break;
+      return std::string("{color:white}") +
+             Text(lockdownEnabled_ ? TextId::kEnabled : TextId::kDisabled) + "{/color}\n\n" +
+             Text(TextId::kLockdownDescription);
     case kEntryManagementNetwork:
-      text = FormatManagementNetworkView(ReadManagementNetworkView(), *Strings(),
+      return FormatManagementNetworkView(ReadManagementNetworkView(), *Strings(),
                                          Description().Width());
-      footer = kMoreFooter;
-      break;
     case kEntryRestartNetwork:
-      text = Text(26);
-      footer = kRestartFooter;
-      break;
+      return Text(TextId::kRestartNetworkDescription);
     case kEntryTestNetwork:
-      text = Text(27);
-      footer = kRunTestFooter;
-      break;
+      return Text(TextId::kTestNetworkDescription);
     case kEntryNetworkRestore:
-      text = Text(28);
-      footer = kMoreFooter;
-      break;
+      return Text(TextId::kNetworkRestoreDescription);
     case kEntrySupportInformation:
-      if (supportPage_ < supportPages_.size()) {
-        text = supportPages_[supportPage_];
-      }
-      footer = kSupportFooter;
-      break;
-    case kEntrySystemLogs:
-      text = LogsDescription();
-      break;
-    case kEntryTroubleshooting:
-      text = Text(30);
-      footer = kMoreFooter;
-      break;
-    case kEntryResetConfiguration:
-      text = Text(31);
-      footer = kResetFooter;
-      break;
-    case kEntryKeyboard:
-      text = Text(34);
-      footer = kMoreFooter;
-      break;
-    default:
-      break;
-  }
-  SetRightTitle(Text(id));
-  Description().SetText(text);
-  SetRightFooter(footer);
-}
-
-std::string GeneralWindow::LogsDescription() {
-  const std::string list = logs_.Describe();
-  return list.empty() ? std::string(Text(29)) : list + "\n" + Text(29);
-}
-
-int GeneralWindow::Run() {
-  Show();
-  for (;;) {
-    const int key = WaitForKey(this, true);
-    const std::uint32_t id = SelectedId();
-    if (key == KEY_DOWN || key == KEY_UP) {
-      Move(key == KEY_DOWN);
-    } else if (key == KEY_NPAGE || key == KEY_PPAGE) {
-      if (id == kEntrySupportInformation) {
-        TurnSupportPage(key == KEY_NPAGE);
-      }
-    } else if (key >= '0' && key <= '9') {
-      if (id == kEntrySystemLogs) {
-        OpenLog(key - '0');
-      }
-    } else if (key == kKeyEsc) {
-      return 1;
-    } else if (key == kKeyEnter) {
-      if (OpenSelected()) {
-        Show();
-      }
+      return supportPage_ < supportPages_.size() ? supportPages_[supportPage_] : std::string();
+    case kEntrySystemLogs: {
+      const std::string list = logs_.Describe();
+      return list.empty() ? std::string(Text(TextId::kLogsDescription))
+                          : list + "\n" + Text(TextId::kLogsDescription);
     }
+    case kEntryTroubleshooting:
+      return Text(TextId::kTroubleshootingDescription);
+    case kEntryResetConfiguration:
+      return Text(TextId::kResetDescription);
+    case kEntryKeyboard:
+      return Text(TextId::kKeyboardDescription);
+    default:
+      return {};
   }
 }
 
-void GeneralWindow::Move(bool down) {
-  if (SelectedId() == kEntrySupportInformation) {
-    supportPage_ = 0;
+bool GeneralWindow::OnKey(int key) {
+  const std::uint32_t id = SelectedId(kEntrySeparator);
+  if (key == KEY_NPAGE || key == KEY_PPAGE) {
+    if (id == kEntrySupportInformation) {
+      TurnSupportPage(key == KEY_NPAGE);
+    }
+    return true;
   }
-  DrawBatch batch;
-  if (down ? Menu().MoveDown() : Menu().MoveUp()) {
-    selected_ = SelectedId();
-    ShowDescription();
+  if (key >= '0' && key <= '9') {
+    if (id == kEntrySystemLogs) {
+      OpenLog(key - '0');
+    }
+    return true;
+  }
+  return false;
+}
+
+void GeneralWindow::BeforeMove() {
+  if (SelectedId(kEntrySeparator) == kEntrySupportInformation) {
+    supportPage_ = 0;
   }
 }
 
@@ -247,35 +174,25 @@ void GeneralWindow::OpenLog(int digit) {
   }
 }
 
-bool GeneralWindow::OpenSelected() {
-  switch (SelectedId()) {
-    case kEntryPassword: {
-      ChangePasswordDialog dialog(this, currentUser);
-      RunFrame(&dialog);
+bool GeneralWindow::Open(std::uint32_t id) {
+  switch (id) {
+    case kEntryPassword:
+      RunDialog<ChangePasswordDialog>(this, currentUser);
       return true;
-    }
     case kEntryLockdown:
       if (RunDialog<LockdownDialog>(this) != 0) {
         lockdownEnabled_ = OskCmdGetFlag(kLockdownQuery);
       }
       return true;
-    case kEntryManagementNetwork:
-      return OpenRegistered(ScreenId::ManagementNetwork);
     case kEntryRestartNetwork:
       if (!GetManagementInterface()) {
-        ShowMessage(this, 16, 19);
+        ShowMessage(this, TextId::kRestartNetworkErrorTitle, TextId::kNoManagementInterface);
         return true;
       }
-      return OpenRegistered(ScreenId::RestartManagementNetwork);
-    case kEntryTestNetwork:
-      return OpenRegistered(ScreenId::TestManagementNetwork);
-    case kEntryNetworkRestore:
-      return OpenRegistered(ScreenId::NetworkRestore);
-    case kEntryTroubleshooting:
-      return OpenRegistered(ScreenId::Troubleshooting);
+      return false;
     case kEntryResetConfiguration:
       if (RunDialog<RestoreDialog>(this) == 0) {
-        ShowMessage(this, 21, 22);
+        ShowMessage(this, TextId::kResetErrorTitle, TextId::kResetFailed);
       }
       return true;
     case kEntryKeyboard:
@@ -286,17 +203,11 @@ bool GeneralWindow::OpenSelected() {
   }
 }
 
-bool GeneralWindow::OpenRegistered(ScreenId screen) {
-  if (!ScreenRegistry::Has(screen)) {
-    return false;
-  }
-  ScreenRegistry::Open(screen, this);
-  return true;
-}
-
 void GeneralWindow::ReloadHostInfo() {
+  const std::uint32_t selected = SelectedId(kEntrySeparator);
   ReadHostState();
   BuildEntries();
+  SelectId(selected);
   Show();
 }
 

@@ -1,17 +1,16 @@
 #pragma once
 /// The System Customization menu: what a logged-in operator works in.
 ///
-/// A full-screen RootWindow whose left half lists the entries and whose
-/// right half describes the selected entry. The welcome screen builds it
-/// after a successful login, runs it with RunFrame and logs the user out
+/// A full-screen menu (MenuWindow) whose left half lists the entries and
+/// whose right half describes the selected entry. The welcome screen builds
+/// it after a successful login, runs it with RunFrame and logs the user out
 /// when it returns:
 ///
-///   auto* menu = new GeneralWindow(this);
-///   RunFrame(menu);  // 1: the operator left with Esc
-///   delete menu;
+///   GeneralWindow menu(this);
+///   RunFrame(&menu);  // 1: the operator left with Esc
 ///
-/// Entries (label = catalogue text of the id; id 3 rows are separators,
-/// never enabled):
+/// Entries (label = catalogue text of the id; separator rows are never
+/// enabled):
 ///
 /// | Id | Label                          | Enabled when                           |
 /// |----|--------------------------------|----------------------------------------|
@@ -27,8 +26,7 @@
 /// | 11 | View Support Information       | always                                 |
 /// | 14 | Reset System Configuration     | the "PXEBootEnabled" option is absent  |
 ///
-/// with separators after 6, 10, 13, 12 and 11 (MenuEntries.h). A disabled
-/// entry shows its label in "{color:dark-grey}" and cannot be chosen.
+/// with separators after 6, 10, 13, 12 and 11 (MenuEntries.h).
 ///
 /// The host state behind the enabling rules (lockdown through osk-cmd,
 /// the management NIC, the network-boot option) and the support pages
@@ -42,10 +40,6 @@
 /// at the first page); the digits open a log in the pager while "View
 /// System Logs" is selected (LogTable.h, LogPager.h); Enter opens the
 /// entry's screen; Esc returns 1. Every other key is ignored.
-///
-/// Screens of other folders (entries 7, 8, 9, 10, 13) are opened through
-/// ScreenRegistry.h; without a registered opener Enter on them does
-/// nothing (for entry 8 the missing-interface message still comes first).
 ///
 /// Decisions of this implementation:
 /// - The status word of entries 5 and 6 stands on its own line in white,
@@ -62,70 +56,47 @@
 ///   (it opens a window, like entries 7 and 13); entry 11's footer shows
 ///   the page hints "<Page Up> <Page Down>" in light grey on the left.
 /// - After a screen opened with Enter returns, the window is shown again
-///   with the same entry selected (Populate keeps the selection when that
-///   entry is still enabled, else selects the first entry). Enter on
-///   entries 11 and 12 does nothing and redraws nothing.
+///   with the same entry selected (when that entry is still enabled, else
+///   the first entry). Enter on entries 11 and 12 does nothing and redraws
+///   nothing.
 
 #include <cstdint>
-#include <memory>
 #include <string>
 #include <vector>
 
 #include "screens/LogTable.h"
 #include "screens/MenuEntries.h"
-#include "screens/ScreenRegistry.h"
-#include "toolkit/RootWindow.h"
+#include "toolkit/MenuWindow.h"
 
 namespace Tulk {
 
-class LabelItem;
-
-class GeneralWindow : public RootWindow {
+class GeneralWindow : public MenuWindow {
  public:
   /// Reads the host state and the support file and builds the entries,
   /// above `owner` (the welcome screen).
   explicit GeneralWindow(Frame* owner);
   ~GeneralWindow() override;
 
-  /// Left title "System Customization", footers, the entries (keeping the
-  /// selected one), and the description of the selected entry.
-  void Populate() override;
-
-  /// The key loop; returns 1 when the operator leaves with Esc.
-  int Run() override;
-
   /// SIGUSR1: reads the host state again, rebuilds the entries and shows
   /// the window again.
   void ReloadHostInfo() override;
 
-  /// Rebuilds the right half for the selected entry.
-  void ShowDescription();
-
-  /// The catalogue id of the selected entry (3 when none).
-  std::uint32_t SelectedId() const;
-  /// The support pages and the index of the one shown.
-  const std::vector<std::string>& SupportPages() const { return supportPages_; }
-  std::uint32_t SupportPage() const { return supportPage_; }
-  bool LockdownEnabled() const { return lockdownEnabled_; }
+ protected:
+  bool OnKey(int key) override;
+  void BeforeMove() override;
 
  private:
   void ReadHostState();
   void BuildEntries();
-  void SelectId(std::uint32_t id);
-  void Move(bool down);
+  std::string Describe(std::uint32_t id);
+  bool Open(std::uint32_t id);
   void TurnSupportPage(bool forward);
-  bool OpenSelected();
-  bool OpenRegistered(ScreenId screen);
   void OpenLog(int digit);
-  std::string LogsDescription();
 
   std::vector<std::string> supportPages_;
   std::uint32_t supportPage_ = 0;
-  std::uint32_t selected_ = 0;
-  std::vector<std::uint32_t> entryIds_;
   bool lockdownEnabled_ = false;
   MenuHostState hostState_;
-  std::vector<std::unique_ptr<LabelItem>> items_;
   LogTable logs_;
 };
 

@@ -54,7 +54,7 @@ void KeyboardDialog::Fill() {
   DrawBatch batch;
   SetTitle(Text(15));
   SetText(Text(257));
-  SetFooter(kOkCancelFooter);
+  SetFooter(Footer::kOkCancel);
   if (list_ != nullptr) {
     list_->Draw();
   }

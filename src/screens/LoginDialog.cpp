@@ -98,7 +98,7 @@ void LoginDialog::ShowMode() {
     password_.SetLabel(Text(kPinLabel));
   } else {
     SetText(LoginHostText(Text(kPasswordLead)));
-    SetFooter(kOkCancelFooter);
+    SetFooter(Footer::kOkCancel);
     name_.SetLabel(Text(kNameLabel));
     name_.SetValue(kDefaultUser);
     password_.SetLabel(Text(kPasswordLabel));

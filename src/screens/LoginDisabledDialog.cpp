@@ -18,7 +18,7 @@ LoginDisabledDialog::LoginDisabledDialog(Frame* owner) : Dialog(owner, 60, 9, 6)
 void LoginDisabledDialog::ShowTexts() {
   SetTitle(Text(kTitle));
   SetText(LoginHostText(Text(kLead)));
-  SetFooter(kOkFooter);
+  SetFooter(Footer::kOk);
 }
 
 int LoginDisabledDialog::Run() {

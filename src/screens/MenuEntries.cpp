@@ -42,9 +42,9 @@ MenuHostState ReadMenuHostState() {
   return state;
 }
 
-std::vector<MenuEntry> BuildMenuEntries(const MenuHostState& state, bool localConsole) {
+std::vector<MenuRow> BuildMenuRows(const MenuHostState& state, bool localConsole) {
   const bool network = state.managementNicUp;
-  std::vector<MenuEntry> entries = {
+  std::vector<MenuRow> entries = {
       {kEntryPassword, true},
       {kEntryLockdown, state.lockdownEnabled || state.lockdownPossible},
       {kEntrySeparator, false},
@@ -67,13 +67,6 @@ std::vector<MenuEntry> BuildMenuEntries(const MenuHostState& state, bool localCo
                                     {kEntryResetConfiguration, !state.networkBoot},
                                 });
   return entries;
-}
-
-std::string EntryLabel(const std::string& text, bool enabled) {
-  if (enabled) {
-    return text;
-  }
-  return "{color:dark-grey}" + text + "{/color}";
 }
 
 }  // namespace Tulk

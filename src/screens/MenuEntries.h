@@ -37,7 +37,7 @@ struct MenuHostState {
 };
 
 /// One row of the menu.
-struct MenuEntry {
+struct MenuRow {
   std::uint32_t id;
   bool enabled;
 };
@@ -49,10 +49,6 @@ MenuHostState ReadMenuHostState();
 
 /// The rows of the menu in order, separators included; the keyboard row
 /// only when `localConsole` is set.
-std::vector<MenuEntry> BuildMenuEntries(const MenuHostState& state, bool localConsole);
-
-/// The label markup of an entry: `text` as it is when enabled, wrapped in
-/// "{color:dark-grey}" and "{/color}" when not.
-std::string EntryLabel(const std::string& text, bool enabled);
+std::vector<MenuRow> BuildMenuRows(const MenuHostState& state, bool localConsole);
 
 }  // namespace Tulk

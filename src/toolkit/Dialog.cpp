@@ -71,4 +71,14 @@ int Dialog::WaitKey() {
   return WaitForKey(this, true);
 }
 
+int Dialog::WaitKeyOrResult(const WorkerResult& result) {
+  return WaitForKeyOrResult(this, true, result);
+}
+
+int Dialog::WaitForEnter() {
+  while (WaitKey() != kKeyEnter) {
+  }
+  return 1;
+}
+
 }  // namespace Tulk

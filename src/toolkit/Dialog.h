@@ -20,34 +20,24 @@
 /// text) exists only when bh - 4 is at least 1; the text areas only when
 /// their height is at least 1.
 ///
-/// A dialog class lays itself out in its constructor and overrides Run()
-/// with its key loop:
-///
-///   int ConfirmDialog::Run() {
-///     for (;;) {
-///       int key = WaitKey();
-///       if (key == kKeyEnter) return 1;
-///       if (key == kKeyEsc) return 0;
-///     }
-///   }
+/// A dialog class lays itself out in its constructor and overrides Run().
+/// Most dialogs are built on the shared patterns instead of a key loop of
+/// their own: FormDialog (items, validation), ConfirmDialog (F11, Y/N/Esc
+/// or Enter/Esc), ProgressDialog (steps with "Done."/"Failed."),
+/// MessageDialog; footers come from Footer.h.
 
 #include <string_view>
 
+#include "toolkit/Footer.h"
 #include "toolkit/Frame.h"
 
 namespace Tulk {
 
 class TextArea;
+class WorkerResult;
 
 class Dialog : public Frame {
  public:
-  /// Footer legends: Enter alone, and Enter with Esc.
-  static constexpr const char kOkFooter[] =
-      "{align:right}{color:black}<Enter>{/color} {color:dark-grey}OK{/color}{/align}";
-  static constexpr const char kOkCancelFooter[] =
-      "{align:right}{color:black}<Enter>{/color} {color:dark-grey}OK{/color}  "
-      "{color:black}<Esc>{/color} {color:dark-grey}Cancel{/color}{/align}";
-
   /// A dialog `width` x `height` with a header `headerHeight` rows high,
   /// centred on the screen, run above `owner`.
   Dialog(Frame* owner, int width, int height, int headerHeight);
@@ -80,6 +70,12 @@ class Dialog : public Frame {
  protected:
   /// The next key for this dialog, with the idle timeout on.
   int WaitKey();
+  /// WaitKey(), or kKeyResultReady (runtime/KeyInput.h) as soon as
+  /// `result` is set by its worker.
+  int WaitKeyOrResult(const WorkerResult& result);
+  /// Waits until Enter is pressed (every other key, Esc too, is ignored);
+  /// returns 1. How reports and messages close.
+  int WaitForEnter();
 
  private:
   Window* header_;

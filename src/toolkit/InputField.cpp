@@ -78,7 +78,7 @@ InputField InputField::HandleKey(InputField state, int key) {
       if (wasPristine) {
         Clear(state);
       }
-      if (Printable(key)) {
+      if (Printable(key) && (state.maxLength == 0 || state.value.size() < state.maxLength)) {
         state.value.insert(state.cursor, 1, static_cast<char>(key));
         ++state.cursor;
       }

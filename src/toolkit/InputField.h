@@ -20,7 +20,8 @@
 /// Every key ends the pristine state: moving onto a field and typing
 /// replaces its value, while Left, Right, Home or End first keep it.
 /// Printable means the bytes 0x20 to 0x7E, whatever the locale. The value
-/// has no length limit; the field scrolls.
+/// has no length limit unless `maxLength` sets one (a printable key is then
+/// not inserted into a full value); the field scrolls.
 
 #include <cstddef>
 #include <string>
@@ -36,6 +37,8 @@ struct InputField {
   std::size_t scroll = 0;
   /// The next editing key replaces the whole value.
   bool pristine = true;
+  /// The most bytes the value takes from typing (0: no limit).
+  std::size_t maxLength = 0;
 
   /// A fresh field: pristine, cursor at the end, no scroll.
   static InputField WithValue(std::string value);

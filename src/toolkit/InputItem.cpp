@@ -12,6 +12,14 @@ void InputItem::HandleKey(int key) {
   field_ = InputField::HandleKey(std::move(field_), key);
 }
 
+bool InputItem::TakeKey(int key) {
+  if (!filter_.Accepts(key)) {
+    return false;
+  }
+  HandleKey(key);
+  return true;
+}
+
 void InputItem::SetValue(std::string value) {
   field_.value = std::move(value);
   field_.cursor = field_.value.size();

@@ -10,11 +10,17 @@
 /// selected whole) and an edited one white on black. Drawing moves the
 /// terminal cursor to the field's cursor; the dialog decides whether the
 /// cursor is shown (Window::ShowCursor).
+///
+/// A key filter (KeyFilter.h) says which keys the field takes; TakeKey()
+/// applies a key only when the filter accepts it. A form passes every key to
+/// its current field first: what the field refuses goes on to the form's
+/// own navigation.
 
 #include <string>
 
 #include "toolkit/InputField.h"
 #include "toolkit/Item.h"
+#include "toolkit/KeyFilter.h"
 
 namespace Tulk {
 
@@ -24,8 +30,17 @@ class InputItem : public Item {
   /// row minus 1); pristine, cursor at the end.
   InputItem(std::string label, std::string value, int width);
 
-  /// Applies an editing key; the dialog redraws the list afterwards.
+  /// Applies an editing key whatever the filter; the dialog redraws the
+  /// list afterwards.
   void HandleKey(int key);
+  /// Applies `key` when the filter accepts it; returns whether it did.
+  bool TakeKey(int key);
+
+  /// The keys the field takes (kAnyText at construction).
+  void SetFilter(const KeyFilter& filter) { filter_ = filter; }
+  const KeyFilter& Filter() const { return filter_; }
+  /// The most bytes typing may put into the value (0: no limit).
+  void SetMaxLength(std::size_t length) { field_.maxLength = length; }
 
   /// Assigns the value: pristine again, cursor at the end.
   void SetValue(std::string value);
@@ -54,6 +69,7 @@ class InputItem : public Item {
   std::string label_;
   int width_;
   bool masked_ = false;
+  KeyFilter filter_ = kAnyText;
   InputField field_;
 };
 

@@ -74,6 +74,16 @@ bool ItemList::SelectByOrdinal(int ordinal) {
   return false;
 }
 
+bool ItemList::SelectItem(const Item* item) {
+  for (int i = 0; i < static_cast<int>(items_.size()); ++i) {
+    if (items_[static_cast<std::size_t>(i)] == item && item->Focusable()) {
+      MakeCurrent(i);
+      return Rows() > 0;
+    }
+  }
+  return false;
+}
+
 bool ItemList::MoveUp() {
   for (int i = CurrentIndex() - 1; i >= 0; --i) {
     if (Selectable(i)) {

@@ -48,6 +48,10 @@ class ItemList : public Window {
   /// view; returns false and changes nothing when there are fewer. Does
   /// not draw.
   bool SelectByOrdinal(int ordinal);
+  /// Makes `item` current (when it is one of the list's focusable items),
+  /// scrolling it into view; returns false and changes nothing otherwise.
+  /// Does not draw.
+  bool SelectItem(const Item* item);
 
   /// Steps to the previous or next enabled focusable item, scrolling as
   /// needed, and draws the list. At either end nothing changes and

@@ -11,13 +11,13 @@ MessageDialog::MessageDialog(Frame* owner, std::uint32_t titleId, std::string me
   // them and the terminal gets the dialog once.
   SetTitle(Text(titleId_));
   SetText(message_);
-  SetFooter(kOkFooter);
+  SetFooter(Footer::kOk);
 }
 
 int MessageDialog::Run() {
   SetTitle(Text(titleId_));
   SetText(message_);
-  SetFooter(kOkFooter);
+  SetFooter(Footer::kOk);
   while (WaitKey() != kKeyEnter) {
   }
   return 1;

@@ -11,13 +11,13 @@ NotificationDialog::NotificationDialog(Frame* owner, std::string title, std::str
       message_(std::move(message)) {
   SetTitle(title_);
   SetText(message_);
-  SetFooter(kOkFooter);
+  SetFooter(Footer::kOk);
 }
 
 int NotificationDialog::Run() {
   SetTitle(title_);
   SetText(message_);
-  SetFooter(kOkFooter);
+  SetFooter(Footer::kOk);
   while (WaitKey() != kKeyEnter) {
   }
   return 1;

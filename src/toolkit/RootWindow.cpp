@@ -6,7 +6,9 @@
 #include <cstring>
 
 #include "include/ColorNumbers.h"
+#include "render/TextId.h"
 #include "runtime/SystemLog.h"
+#include "toolkit/Footer.h"
 #include "toolkit/ItemList.h"
 #include "toolkit/TextArea.h"
 
@@ -26,14 +28,14 @@ RootWindow::RootWindow(Frame* owner)
       description_(new TextArea(rightPane_, 2, 4, COLS / 2 - 4, LINES - 7, -1, kLightGrey)) {
   mainArea_->Box();
   mainArea_->HorizontalLine(1, 2, mainArea_->Width() - 2);
-  leftFooter_->SetText(kSelectFooter);
+  leftFooter_->SetText(Footer::kMenuSelect);
   Log(LOG_INFO, "COLS=%d, LINES=%d", COLS, LINES);
 }
 
 void RootWindow::Show() {
   DrawBatch batch;
   Redraw(true);
-  const char* version = Text(2);
+  const char* version = Text(TextId::kVersionLine);
   int length = static_cast<int>(std::strlen(version));
   statusLine_->Erase();
   statusLine_->PutText(statusLine_->Width() / 2 - length / 2, 0, version);

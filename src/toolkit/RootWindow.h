@@ -37,10 +37,6 @@ class TextArea;
 
 class RootWindow : public Frame {
  public:
-  /// The left footer every menu starts with.
-  static constexpr const char kSelectFooter[] =
-      "{color:black}<Up/Down>{/color}{color:dark-grey} Select{/color}";
-
   /// Builds the window above `owner` and logs "COLS=%d, LINES=%d".
   explicit RootWindow(Frame* owner);
 

@@ -29,6 +29,7 @@
 #include "platform/api/SystemInformation.h"
 #include "platform/sim/DemoHost.h"
 #include "platform/sim/SimHost.h"
+#include "platform/sim/StateSchema.h"
 
 extern char** environ;
 

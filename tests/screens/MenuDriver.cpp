@@ -6,8 +6,6 @@
 //   TULK_MENU_SCENE   menu (default), lockdown, keyboard, restore
 //   TULK_MENU_USER    the logged-in user (default "root")
 //   TULK_MENU_EMPTY_PASSWORD=1   the login's password was empty
-//   TULK_MENU_OPENERS=1   registers openers for the other folders' screens
-//                     that show "Opened <name>" in a notification dialog
 //
 // The home frame shows "result: N" after the scene; "o" opens it again.
 
@@ -25,9 +23,7 @@
 #include "screens/KeyboardDialog.h"
 #include "screens/LockdownDialog.h"
 #include "screens/RestoreDialog.h"
-#include "screens/ScreenRegistry.h"
 #include "screens/SupportValues.h"
-#include "toolkit/NotificationDialog.h"
 #include "toolkit/RunFrame.h"
 
 namespace {
@@ -37,22 +33,6 @@ using namespace Tulk;
 std::string Env(const char* name, const char* fallback) {
   const char* value = std::getenv(name);
   return value != nullptr ? value : fallback;
-}
-
-void RegisterTestOpeners() {
-  const std::pair<ScreenId, const char*> screens[] = {
-      {ScreenId::ManagementNetwork, "ManagementNetwork"},
-      {ScreenId::RestartManagementNetwork, "RestartManagementNetwork"},
-      {ScreenId::TestManagementNetwork, "TestManagementNetwork"},
-      {ScreenId::NetworkRestore, "NetworkRestore"},
-      {ScreenId::Troubleshooting, "Troubleshooting"},
-  };
-  for (const auto& [id, name] : screens) {
-    ScreenRegistry::Register(id, [title = std::string(name)](Frame* owner) {
-      NotificationDialog dialog(owner, "Opened " + title, "");
-      return RunFrame(&dialog);
-    });
-  }
 }
 
 template <typename Scene>
@@ -116,9 +96,6 @@ int main(int argc, char** argv) {
   hooks.afterStartup = [] {
     StartHostServices();
     RegisterSupportValueProviders();
-    if (Env("TULK_MENU_OPENERS", "0") == "1") {
-      RegisterTestOpeners();
-    }
   };
   hooks.runWelcome = [] {
     DriverHome home;

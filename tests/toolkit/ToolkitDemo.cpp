@@ -32,7 +32,7 @@
 #include "toolkit/ItemList.h"
 #include "toolkit/LabelItem.h"
 #include "toolkit/MessageDialog.h"
-#include "toolkit/PortGroupInfo.h"
+#include "host/PortGroupInfo.h"
 #include "toolkit/RootWindow.h"
 #include "toolkit/RunFrame.h"
 #include "toolkit/TextArea.h"
@@ -98,7 +98,7 @@ class InputDemo : public Dialog {
       : Dialog(owner, 60, 13, 6), name_("Login Name:", "root", 30), password_("Password:", "", 30) {
     SetTitle("Authentication Required");
     SetText("Enter an authorized login name and password for demo.");
-    SetFooter(kOkCancelFooter);
+    SetFooter(Footer::kOkCancel);
     password_.SetMasked(true);
     list_ = new ItemList(Content(), 0, 0, Content()->Width(), 2);
     list_->SetItems({&name_, &password_});
@@ -235,7 +235,7 @@ class DemoHome : public Frame {
       Dialog dialog(this, 60, 9, 6);
       dialog.SetTitle("Demo Dialog");
       dialog.SetText("Header text of the demo");
-      dialog.SetFooter(Dialog::kOkCancelFooter);
+      dialog.SetFooter(Footer::kOkCancel);
       result = RunFrame(&dialog);
     }
     PutText(2, 3, "result: " + std::to_string(result) + detail);

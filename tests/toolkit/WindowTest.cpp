@@ -72,7 +72,7 @@ TEST_F(WindowTest, OversizedDialogIsCutToTheScreen) {
 TEST_F(WindowTest, DialogDrawsItsPartsInTheirColoursAndDimsAsAWhole) {
   Dialog dialog(nullptr, 60, 13, 6);
   dialog.SetTitle("Title");
-  dialog.SetFooter(Dialog::kOkFooter);
+  dialog.SetFooter(Footer::kOk);
   dialog.Redraw(true);
   EXPECT_EQ(ScreenColors(6, 10), std::make_pair(kBlack, kWhite));  // box corner
   EXPECT_EQ(LineAt(6, 10), "\u250c");

@@ -12,6 +12,7 @@
 
 #include "platform/api/HostMgrException.h"
 #include "platform/sim/DemoHost.h"
+#include "platform/sim/StateSchema.h"
 
 namespace Sim {
 namespace {

@@ -113,10 +113,6 @@ class SimHost {
   struct stat stamp_ {};
 };
 
-/// Validates a parsed state document; throws StateError naming the first
-/// problem ("network.pnics[1].linkUp must be a boolean").
-void ValidateState(const nlohmann::json& state);
-
 /// Writes `text` to `path` atomically (temporary file in the same folder,
 /// fsync, rename). Throws StateError on failure.
 void WriteFileAtomically(const std::string& path, const std::string& text);

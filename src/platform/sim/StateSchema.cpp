@@ -1,3 +1,5 @@
+#include "platform/sim/StateSchema.h"
+
 #include <initializer_list>
 #include <string>
 

@@ -1,4 +1,4 @@
-#include "toolkit/PortGroupInfo.h"
+#include "host/PortGroupInfo.h"
 
 namespace Tulk {
 

@@ -1,4 +1,4 @@
-#include "toolkit/InfoType.h"
+#include "host/InfoType.h"
 
 namespace Tulk {
 

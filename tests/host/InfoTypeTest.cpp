@@ -5,9 +5,9 @@
 
 #include "render/MarkupLayout.h"
 #include "toolkit/CarouselRadioItem.h"
-#include "toolkit/HykNicInfo.h"
+#include "host/HykNicInfo.h"
 #include "toolkit/InfoDialog.h"
-#include "toolkit/PortGroupInfo.h"
+#include "host/PortGroupInfo.h"
 
 namespace {
 

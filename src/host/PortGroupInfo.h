@@ -4,7 +4,7 @@
 
 #include <string>
 
-#include "toolkit/InfoType.h"
+#include "host/InfoType.h"
 
 namespace Tulk {
 

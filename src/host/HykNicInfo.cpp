@@ -1,4 +1,4 @@
-#include "toolkit/HykNicInfo.h"
+#include "host/HykNicInfo.h"
 
 namespace Tulk {
 
