@@ -8,6 +8,7 @@
 
 #include "host/HardwareInventory.h"
 #include "host/SwitchSummary.h"
+#include "host/VlanInput.h"
 
 namespace {
 
@@ -51,6 +52,36 @@ TEST(SwitchSummaryTest, FormatsCountsAndNameLists) {
   EXPECT_EQ(Tulk::FormatSwitchSummary(bare),
             "Number of ports: -1\nUsed ports: 0\nConfigured ports: 0\nUplinks: None\n"
             "Port groups: None");
+}
+
+}  // namespace
+
+namespace {
+
+TEST(VlanInputTest, EmptyIsNoVlanAndOnlyOneTo4095AreIds) {
+  using Kind = Tulk::VlanInput::Kind;
+  struct Case {
+    const char* text;
+    Kind kind;
+    int id;
+  };
+  const Case cases[] = {
+      {"", Kind::kNone, 0},
+      {"1", Kind::kVlan, 1},
+      {"4094", Kind::kVlan, 4094},
+      {"0042", Kind::kVlan, 42},
+      {"4095", Kind::kAllVlans, 4095},
+      {"0", Kind::kInvalid, 0},
+      {"4096", Kind::kInvalid, 0},
+      {"99999999999999999999", Kind::kInvalid, 0},
+      {"12a", Kind::kInvalid, 0},
+      {"-1", Kind::kInvalid, 0},
+  };
+  for (const Case& c : cases) {
+    const Tulk::VlanInput input = Tulk::VlanInput::Parse(c.text);
+    EXPECT_EQ(input.kind, c.kind) << c.text;
+    EXPECT_EQ(input.id, c.id) << c.text;
+  }
 }
 
 }  // namespace
