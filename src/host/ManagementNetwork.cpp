@@ -41,6 +41,28 @@ std::string GetManagementIpv4Address() {
   return address;
 }
 
+bool IsManagementInterfaceUp() {
+  std::unique_ptr<HykCtl::Network::HykNicImpl> nic = GetManagementInterface();
+  if (!nic) {
+    return false;
+  }
+  try {
+    return nic->IsEnabled();
+  } catch (const HostMgrException& failure) {
+    Log(LOG_ERR, "Getting management interface state failed: %s", failure.what());
+    return false;
+  }
+}
+
+std::string GetHostName() {
+  try {
+    return HykCtl::Network::DnsConfigImpl(kDefaultTcpipStack).GetHostname();
+  } catch (const HostMgrException& failure) {
+    Log(LOG_ERR, "Getting host name failed: %s", failure.what());
+    return kNotAvailable;
+  }
+}
+
 std::string GetHostFqdn() {
   try {
     HykCtl::Network::DnsConfigImpl dns(kDefaultTcpipStack);

@@ -24,6 +24,15 @@ std::unique_ptr<HykCtl::Network::HykNicImpl> GetManagementInterface();
 /// address failed: %s" at error level and gives "0.0.0.0".
 std::string GetManagementIpv4Address();
 
+/// Whether a management kernel NIC exists and is in service; false also
+/// when the question fails (logged as "Getting management interface state
+/// failed: %s").
+bool IsManagementInterfaceUp();
+
+/// The host name (without domain) of "defaultTcpipStack"; "N/A" when it
+/// cannot be read (logged as "Getting host name failed: %s").
+std::string GetHostName();
+
 /// Host name, ".", domain, from the DNS configuration of
 /// "defaultTcpipStack". An empty domain leaves the trailing dot
 /// ("tavi-01."). A host-control failure logs "Getting host name failed: %s"

@@ -40,39 +40,35 @@
 
 #include <string>
 
-#include "toolkit/Dialog.h"
-#include "toolkit/InputItem.h"
+#include "toolkit/FormDialog.h"
 
 namespace Tulk {
 
-class ItemList;
+class InputItem;
 
-class ChangePasswordDialog : public Dialog {
+class ChangePasswordDialog : public FormDialog {
  public:
-  /// The dialog for `user` above `owner`.
+  /// The dialog for `user` above `owner`. Run() (FormDialog) returns 1
+  /// after a successful change (and sets `passwordWasEmpty` from the new
+  /// password), 0 when left with Esc.
   ChangePasswordDialog(Frame* owner, std::string user);
-
-  /// The key loop. Returns 1 after a successful change (and sets
-  /// `passwordWasEmpty` from the new password), 0 when left with Esc.
-  int Run() override;
 
   /// The user whose password is changed.
   const std::string& User() const { return user_; }
 
- private:
-  enum Field { kOldField = 0, kNewField = 1, kConfirmField = 2 };
+ protected:
+  bool OnKey(int key) override;
+  bool Accept() override;
 
+ private:
   bool CheckOldPassword();
-  bool Submit();
   void ReportSuccess();
   void ResetNewFields();
-  void Select(Field field);
 
   std::string user_;
-  InputItem oldPassword_;
-  InputItem newPassword_;
-  InputItem confirmPassword_;
-  ItemList* list_ = nullptr;
+  InputItem* oldPassword_;
+  InputItem* newPassword_;
+  InputItem* confirmPassword_;
 };
 
 }  // namespace Tulk

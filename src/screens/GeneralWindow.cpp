@@ -12,7 +12,7 @@
 #include "screens/KeyboardDialog.h"
 #include "screens/LockdownDialog.h"
 #include "screens/LogPager.h"
-#include "screens/ManagementNetworkView.h"
+#include "screens/ManagementNetworkPane.h"
 #include "screens/RestoreDialog.h"
 #include "screens/SupportPages.h"
 #include "toolkit/Footer.h"

@@ -3,8 +3,8 @@
 ///
 /// A dialog 60 x 19 with a header of 7 rows: title 15 ("Configure
 /// Keyboard"), header text 257, and in the body a list of radio buttons,
-/// one per layout the host offers (HykCtl::System::SystemInfoImpl
-/// GetKeyboardLayouts, in the host's order), 8 rows high with a scroll bar
+/// one per layout the host offers (ReadKeyboardLayouts(), in the host's
+/// order), 8 rows high with a scroll bar
 /// when there are more. The configured layout is selected and current at
 /// the start.
 ///
@@ -21,41 +21,37 @@
 /// dialog then returns 0. The login dialog and the System Customization
 /// menu both run it.
 
-#include <memory>
 #include <string>
 #include <vector>
 
-#include "toolkit/Dialog.h"
+#include "toolkit/FormDialog.h"
+#include "toolkit/RadioGroup.h"
 
 namespace Tulk {
 
-class ItemList;
-class RadioItem;
-
-class KeyboardDialog : public Dialog {
+class KeyboardDialog : public FormDialog {
  public:
   /// Reads the host's layouts and the configured one and lays the dialog
   /// out above `owner`.
   explicit KeyboardDialog(Frame* owner);
   ~KeyboardDialog() override;
 
-  /// The key loop: 1 when a layout was chosen with Enter, 0 on Esc or a
-  /// host failure.
+  /// 1 when a layout was chosen with Enter, 0 on Esc or a host failure.
   int Run() override;
 
   const std::vector<std::string>& Layouts() const { return layouts_; }
   const std::string& Configured() const { return configured_; }
 
+ protected:
+  bool Accept() override;
+
  private:
-  void Fill();
-  void Select(std::size_t index);
-  int Fail(const std::string& logLine);
+  void Fail(const std::string& logLine);
 
   std::vector<std::string> layouts_;
   std::string configured_;
   std::string readError_;
-  std::vector<std::unique_ptr<RadioItem>> items_;
-  ItemList* list_ = nullptr;
+  RadioGroup group_;
 };
 
 }  // namespace Tulk

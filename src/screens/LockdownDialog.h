@@ -16,33 +16,24 @@
 /// "Please check the syslog for more information." (280) is shown before
 /// the dialog returns 1 (the caller reads the state again either way).
 
-#include "toolkit/CheckItem.h"
-#include "toolkit/Dialog.h"
+#include "toolkit/FormDialog.h"
 
 namespace Tulk {
 
-class ItemList;
+class CheckItem;
 
-class LockdownDialog : public Dialog {
+class LockdownDialog : public FormDialog {
  public:
   /// Reads the host's lockdown state and lays the dialog out above
-  /// `owner`.
+  /// `owner`. Run() (FormDialog) returns 1 after Enter, 0 after Esc.
   explicit LockdownDialog(Frame* owner);
-  ~LockdownDialog() override;
 
-  /// The key loop: 1 after Enter, 0 after Esc.
-  int Run() override;
-
-  /// The host's state when the dialog was built, and the box.
-  bool WasEnabled() const { return wasEnabled_; }
-  bool Ticked() const;
+ protected:
+  bool Accept() override;
 
  private:
-  void Fill();
-
   bool wasEnabled_;
-  CheckItem box_;
-  ItemList* list_;
+  CheckItem* box_;
 };
 
 }  // namespace Tulk

@@ -10,12 +10,13 @@
 /// - smart card (`pinMode`, chosen when the smart-card check found a card):
 ///   "Login Id:" filled with the card's user id, "PIN:".
 ///
-/// Keys: Up/Down move; Tab or Enter on any item but the password moves to
-/// the next one, Tab on the password back to the first; Enter on the
-/// keyboard label runs the keyboard dialog and relabels the item; F3
-/// switches the mode (the fields get the mode's values again); Esc leaves
-/// without any log line or record; printable keys and Left, Right, Home,
-/// End and Backspace edit the current field; all other keys are ignored.
+/// Keys (a FormDialog): Up/Down move; Tab or Enter on any item but the
+/// password moves to the next one, Tab on the password back to the first;
+/// Enter on the keyboard label runs the keyboard dialog and relabels the
+/// item; F3 switches the mode (the fields get the mode's values again); Esc
+/// leaves without any log line or record; printable keys and Left, Right,
+/// Home, End and Backspace edit the current field (kLoginText); all other
+/// keys are ignored. The cursor stays shown, on the keyboard label too.
 ///
 /// Enter on the password authenticates through PAM (PamAuthenticator):
 /// - success: `currentUser`, `passwordWasEmpty`, "Authentication of user %s
@@ -41,22 +42,19 @@
 #include <string>
 
 #include "host/EventReporter.h"
-#include "toolkit/Dialog.h"
-#include "toolkit/InputItem.h"
-#include "toolkit/LabelItem.h"
+#include "toolkit/FormDialog.h"
 
 namespace Tulk {
 
-class ItemList;
+class InputItem;
+class LabelItem;
 
-class LoginDialog : public Dialog {
+class LoginDialog : public FormDialog {
  public:
   /// Lays the dialog out above `owner`, runs the smart-card check and
-  /// chooses the mode.
+  /// chooses the mode. Run() (FormDialog) returns 1 after a successful
+  /// login, 0 when left with Esc.
   explicit LoginDialog(Frame* owner);
-
-  /// The key loop: 1 after a successful login, 0 when left with Esc.
-  int Run() override;
 
   /// The user name entered for the last attempt (kept after the dialog
   /// closed).
@@ -64,16 +62,20 @@ class LoginDialog : public Dialog {
   /// The dialog is in smart-card mode.
   bool PinMode() const { return pinMode_; }
 
+ protected:
+  void Prepare() override;
+  bool OnKey(int key) override;
+  bool Accept() override;
+  void Cancelled() override;
+
  private:
   void ShowMode();
   void RelabelKeyboard();
-  bool TryLogin();
   void ReportFailure(const char* reason, TulkEvent event, std::uint32_t messageId);
 
-  ItemList* list_ = nullptr;
-  LabelItem keyboard_;
-  InputItem name_;
-  InputItem password_;
+  LabelItem* keyboard_ = nullptr;
+  InputItem* name_ = nullptr;
+  InputItem* password_ = nullptr;
   bool pinMode_ = false;
   std::string userName_;
 };

@@ -1,13 +1,14 @@
 #include "screens/LoginDisabledDialog.h"
 
 #include "include/Keys.h"
+#include "render/TextId.h"
 #include "screens/ConsoleLogin.h"
 
 namespace Tulk {
 namespace {
 
-constexpr std::uint32_t kTitle = 147;
-constexpr std::uint32_t kLead = 148;
+constexpr std::uint32_t kTitle = TextId::kAuthenticationDenied;
+constexpr std::uint32_t kLead = TextId::kConsoleAccessDisabled;
 
 }  // namespace
 

@@ -2,34 +2,9 @@
 
 #include "host/HostTools.h"
 #include "host/ManagementNetwork.h"
-#include "include/Constants.h"
-#include "platform/api/AdvancedOption.h"
-#include "platform/api/HostMgrException.h"
+#include "host/SystemSettings.h"
 
 namespace Tulk {
-namespace {
-
-bool HasNetworkBootOption() {
-  try {
-    return HykCtl::Adv::UserAdvancedOptionImpl().HasUserOption(kPxeBootOption);
-  } catch (const HostMgr::Lib::HostMgrException&) {
-    return false;
-  }
-}
-
-bool ManagementNicUp() {
-  std::unique_ptr<HykCtl::Network::HykNicImpl> nic = GetManagementInterface();
-  if (!nic) {
-    return false;
-  }
-  try {
-    return nic->IsEnabled();
-  } catch (const HostMgr::Lib::HostMgrException&) {
-    return false;
-  }
-}
-
-}  // namespace
 
 MenuHostState ReadMenuHostState() {
   MenuHostState state;
@@ -37,7 +12,7 @@ MenuHostState ReadMenuHostState() {
   if (!state.lockdownEnabled) {
     state.lockdownPossible = OskCmdGetFlag("osksvc/auth/lockdown_is_possible");
   }
-  state.managementNicUp = ManagementNicUp();
+  state.managementNicUp = IsManagementInterfaceUp();
   state.networkBoot = HasNetworkBootOption();
   return state;
 }

@@ -28,12 +28,4 @@ int PowerConfirmDialog::Run() {
   }
 }
 
-ShutdownConfirmDialog::ShutdownConfirmDialog(Frame* owner, bool graceful)
-    : PowerConfirmDialog(owner, graceful, 173, 174, "poweroff") {
-}
-
-RebootConfirmDialog::RebootConfirmDialog(Frame* owner, bool graceful)
-    : PowerConfirmDialog(owner, graceful, 177, 178, "reboot") {
-}
-
 }  // namespace Tulk

@@ -16,8 +16,8 @@
 ///    loop, so the console uses no CPU meanwhile (an idle timeout still
 ///    ends the session as everywhere else).
 ///
-/// ShutdownConfirmDialog and RebootConfirmDialog fix the texts and the
-/// command.
+/// ShutdownConfirmDialog and RebootConfirmDialog (their own headers) fix the
+/// texts and the command.
 
 #include <cstdint>
 #include <string>
@@ -49,19 +49,4 @@ class PowerConfirmDialog : public Dialog {
 };
 
 /// "Shut Down Host", "Shutdown in progress...", then "poweroff".
-class ShutdownConfirmDialog : public PowerConfirmDialog {
- public:
-  /// The progress dialog above `owner`; `graceful` is true when running
-  /// machines are not to be terminated.
-  ShutdownConfirmDialog(Frame* owner, bool graceful);
-};
-
-/// "Restart Host", "Restart in progress...", then "reboot".
-class RebootConfirmDialog : public PowerConfirmDialog {
- public:
-  /// The progress dialog above `owner`; `graceful` as for
-  /// ShutdownConfirmDialog.
-  RebootConfirmDialog(Frame* owner, bool graceful);
-};
-
 }  // namespace Tulk

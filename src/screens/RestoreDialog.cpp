@@ -7,21 +7,15 @@
 
 #include "host/CommandRunner.h"
 #include "host/EventReporter.h"
-#include "include/Keys.h"
+#include "render/TextId.h"
 #include "runtime/HostPath.h"
 #include "runtime/KeyInput.h"
 #include "runtime/SystemLog.h"
 #include "screens/ShellQuote.h"
-#include "toolkit/TextArea.h"
 
 namespace Tulk {
 namespace {
 
-constexpr char kConfirmFooter[] =
-    "{align:right}{color:black}<F11>{/color} {color:dark-grey}OK{/color}  "
-    "{color:black}<Esc>{/color} {color:dark-grey}Cancel{/color}{/align}";
-constexpr char kRestartFooter[] =
-    "{align:right}{color:black}<Enter>{/color} {color:dark-grey}Restart Host{/color}{/align}";
 constexpr char kResetScript[] = "/sbin/firmwareConfig.py";
 
 [[noreturn]] void WaitForHostToGoDown() {
@@ -34,40 +28,27 @@ constexpr char kResetScript[] = "/sbin/firmwareConfig.py";
 
 }  // namespace
 
-RestoreDialog::RestoreDialog(Frame* owner) : Dialog(owner, 60, 12, 7) {
+RestoreDialog::RestoreDialog(Frame* owner) : ConfirmDialog(owner, 60, 12, 7, ConfirmKeys::kF11) {
   if (Content() != nullptr) {
-    area_ = new TextArea(Content(), 0, 0, Content()->Width() - 6, Content()->Height());
+    PlaceQuestion(0, 0, Content()->Width() - 6, Content()->Height());
   }
+  SetTitle(Text(TextId::kResetConfirmTitle));
+  SetText(Text(TextId::kResetConfirmText));
+  SetQuestion(Text(TextId::kResetQuestion));
+  SetFooter(Footer::kF11OkCancel);
 }
 
-RestoreDialog::~RestoreDialog() = default;
-
 int RestoreDialog::Run() {
-  {
-    DrawBatch batch;
-    SetTitle(Text(179));
-    SetText(Text(180));
-    if (area_ != nullptr) {
-      area_->SetText(Text(181));
-    }
-    SetFooter(kConfirmFooter);
-  }
-  for (;;) {
-    const int key = WaitKey();
-    if (key == kKeyEsc) {
-      return 0;
-    }
-    if (key == KEY_F(11)) {
-      break;
-    }
+  if (Ask() != Answer::kYes) {
+    return 0;
   }
 
   Log(LOG_INFO, "Restoring factory defaults");
   PostEvent(TulkEvent::RestoreFactoryDefaults);
   {
     DrawBatch batch;
-    SetTitle(Text(182));
-    SetText(Text(183));
+    SetTitle(Text(TextId::kResetTitle));
+    SetText(Text(TextId::kResetWait));
   }
   const std::string reset = ShellQuote(HostPath(kResetScript)) + " --reset-only > /dev/null 2>&1";
   if (RunShellCommand(reset) != 0) {
@@ -76,14 +57,11 @@ int RestoreDialog::Run() {
 
   {
     DrawBatch batch;
-    if (area_ != nullptr) {
-      area_->SetText("");
-    }
-    SetFooter(kRestartFooter);
-    SetText(Text(184));
+    SetQuestion("");
+    SetFooter(Footer::kRestartHost);
+    SetText(Text(TextId::kResetDone));
   }
-  while (WaitKey() != kKeyEnter) {
-  }
+  WaitForEnter();
   if (RunShellCommand("reboot -f") == -1) {
     return 0;
   }

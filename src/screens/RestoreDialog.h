@@ -27,24 +27,18 @@
 /// SIGTERM still end the process with status 0, so the host's own shutdown
 /// does not have to wait for a kill; every other signal is ignored.
 
-#include "toolkit/Dialog.h"
+#include "toolkit/ConfirmDialog.h"
 
 namespace Tulk {
 
-class TextArea;
-
-class RestoreDialog : public Dialog {
+class RestoreDialog : public ConfirmDialog {
  public:
   /// Lays the dialog out above `owner`.
   explicit RestoreDialog(Frame* owner);
-  ~RestoreDialog() override;
 
   /// 0 when cancelled, when the reset failed or when "reboot -f" could not
   /// be run; otherwise it does not return.
   int Run() override;
-
- private:
-  TextArea* area_ = nullptr;
 };
 
 }  // namespace Tulk

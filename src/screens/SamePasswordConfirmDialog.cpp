@@ -1,18 +1,14 @@
 #include "screens/SamePasswordConfirmDialog.h"
 
+#include "render/TextId.h"
+
 namespace Tulk {
-namespace {
 
-constexpr char kFooter[] =
-    "{color:black}<Enter>{/color} {color:dark-grey}Confirm{/color}{align:right}"
-    "{color:black}<Esc>{/color} {color:dark-grey}Cancel{/color}{/align}";
-
-}  // namespace
-
-SamePasswordConfirmDialog::SamePasswordConfirmDialog(Frame* owner) : Dialog(owner, 60, 9, 6) {
-  SetTitle(Text(163));
-  SetText(Text(167));
-  SetFooter(kFooter);
+SamePasswordConfirmDialog::SamePasswordConfirmDialog(Frame* owner)
+    : ConfirmDialog(owner, 60, 9, 6, ConfirmKeys::kEnter) {
+  SetTitle(Text(TextId::kPasswordWarningTitle));
+  SetText(Text(TextId::kSamePassword));
+  SetFooter(Footer::kConfirmCancel);
 }
 
 }  // namespace Tulk

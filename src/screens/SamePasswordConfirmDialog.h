@@ -6,14 +6,14 @@
 /// password. Are you sure?", footer "<Enter> Confirm" and "<Esc> Cancel".
 /// Enter returns 1, Esc 0; other keys are ignored.
 
-#include "toolkit/Dialog.h"
+#include "toolkit/ConfirmDialog.h"
 
 namespace Tulk {
 
-class SamePasswordConfirmDialog : public Dialog {
+class SamePasswordConfirmDialog : public ConfirmDialog {
  public:
-  /// Lays the question out above `owner`; the default Dialog key loop
-  /// answers it.
+  /// Lays the question out above `owner`; Enter confirms (1), Esc cancels
+  /// (0), every other key is ignored.
   explicit SamePasswordConfirmDialog(Frame* owner);
 };
 

@@ -6,53 +6,36 @@
 #include <memory>
 
 #include "host/EventReporter.h"
-#include "include/Keys.h"
+#include "render/TextId.h"
 #include "runtime/SystemLog.h"
-#include "screens/PowerConfirmDialog.h"
-#include "toolkit/ItemList.h"
+#include "screens/RebootConfirmDialog.h"
+#include "screens/ShutdownConfirmDialog.h"
+#include "toolkit/CheckItem.h"
 #include "toolkit/RunFrame.h"
 
 namespace Tulk {
-namespace {
 
-constexpr std::uint32_t kTitle = 170;
-constexpr std::uint32_t kMessage = 171;
-constexpr std::uint32_t kTerminateCaption = 172;
-constexpr char kFooter[] =
-    "{color:black}<F2>{/color} {color:dark-grey}Shut Down{/color}  {color:black}<F11>{/color} "
-    "{color:dark-grey}Restart{/color}{align:right}{color:black}<Esc>{/color} "
-    "{color:dark-grey}Cancel{/color}{/align}";
-
-}  // namespace
-
-ShutdownDialog::ShutdownDialog(Frame* owner)
-    : Dialog(owner, 60, 19, 13), terminate_(Text(kTerminateCaption), false, 0) {
-  list_ = new ItemList(Content(), 0, 0, Content()->Width(), Content()->Height());
-  list_->SetItems({&terminate_});
-  SetTitle(Text(kTitle));
-  SetText(Text(kMessage));
-  SetFooter(kFooter);
+ShutdownDialog::ShutdownDialog(Frame* owner) : FormDialog(owner, 60, 19, 13) {
+  terminate_ = &AddCheck(Text(TextId::kForceTerminateVms));
+  SetTitle(Text(TextId::kShutdownTitle));
+  SetText(Text(TextId::kShutdownText));
+  SetFooter(Footer::kShutdownRestartCancel);
 }
 
-int ShutdownDialog::Run() {
-  list_->Draw();
-  for (;;) {
-    const int key = WaitKey();
-    if (key == kKeySpace) {
-      terminate_.Toggle();
-      list_->Draw();
-    } else if (key == KEY_F(2)) {
-      PowerAction(false);
-    } else if (key == KEY_F(11)) {
-      PowerAction(true);
-    } else if (key == kKeyEsc) {
-      return 0;
-    }
+bool ShutdownDialog::OnKey(int key) {
+  if (key == KEY_F(2) || key == KEY_F(11)) {
+    PowerAction(key == KEY_F(11));
+    return true;
   }
+  return false;
+}
+
+bool ShutdownDialog::Accept() {
+  return false;
 }
 
 void ShutdownDialog::PowerAction(bool reboot) {
-  const bool graceful = !terminate_.Checked();
+  const bool graceful = !terminate_->Checked();
   std::unique_ptr<PowerConfirmDialog> confirm;
   if (reboot) {
     Log(LOG_INFO, "Rebooting host");

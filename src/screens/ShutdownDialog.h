@@ -13,26 +13,27 @@
 /// Opened from the welcome screen (F12 after the login) and from the System
 /// Customization menu.
 
-#include "toolkit/CheckItem.h"
-#include "toolkit/Dialog.h"
+#include "toolkit/FormDialog.h"
 
 namespace Tulk {
 
-class ItemList;
+class CheckItem;
 
-class ShutdownDialog : public Dialog {
+class ShutdownDialog : public FormDialog {
  public:
-  /// Lays the dialog out above `owner`, the check box unticked.
+  /// Lays the dialog out above `owner`, the check box unticked. Run()
+  /// (FormDialog) returns 0 (nothing changed) when left with Esc; Enter
+  /// does nothing.
   explicit ShutdownDialog(Frame* owner);
 
-  /// The key loop; returns 0 (nothing changed) when left with Esc.
-  int Run() override;
+ protected:
+  bool OnKey(int key) override;
+  bool Accept() override;
 
  private:
   void PowerAction(bool reboot);
 
-  CheckItem terminate_;
-  ItemList* list_ = nullptr;
+  CheckItem* terminate_;
 };
 
 }  // namespace Tulk

@@ -3,11 +3,11 @@
 #include <syslog.h>
 
 #include <cstdlib>
-#include <vector>
+#include <optional>
+#include <string>
 
+#include "host/SystemSettings.h"
 #include "include/ProcessFlags.h"
-#include "platform/api/Authentication.h"
-#include "platform/api/HostMgrException.h"
 #include "runtime/SystemLog.h"
 
 namespace Tulk {
@@ -21,29 +21,26 @@ void RunSmartCardCheck() {
   if (loggedIn && !g_smartCardSession) {
     return;
   }
-  std::vector<HostMgr::Authentication::SmartCardToken> tokens;
-  try {
-    tokens = HostMgr::Authentication::LookupSmartCardTokens();
-  } catch (const HostMgr::Lib::HostMgrException&) {
-    Log(LOG_ERR, "Error trying to lookup smart card tokens.");
-    return;
-  }
   if (loggedIn) {
-    for (const auto& token : tokens) {
-      if (token.valid && token.userId == currentUser) {
-        return;
-      }
+    const std::optional<bool> present = SmartCardPresentFor(currentUser);
+    if (!present) {
+      Log(LOG_ERR, "Error trying to lookup smart card tokens.");
+      return;
+    }
+    if (*present) {
+      return;
     }
     Log(LOG_INFO, "Logging out user id '%s'", currentUser.c_str());
     std::exit(0);
   }
-  smartCardUser.clear();
-  for (const auto& token : tokens) {
-    if (token.valid && !token.userId.empty()) {
-      smartCardUser = token.userId;
-      Log(LOG_INFO, "Found smart card with user id '%s'", smartCardUser.c_str());
-      return;
-    }
+  const std::optional<std::string> user = FindSmartCardUser();
+  if (!user) {
+    Log(LOG_ERR, "Error trying to lookup smart card tokens.");
+    return;
+  }
+  smartCardUser = *user;
+  if (!smartCardUser.empty()) {
+    Log(LOG_INFO, "Found smart card with user id '%s'", smartCardUser.c_str());
   }
 }
 

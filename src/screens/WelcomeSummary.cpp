@@ -5,6 +5,7 @@
 #include <cstdio>
 
 #include "render/StringFactory.h"
+#include "render/TextId.h"
 
 namespace Tulk {
 namespace {
@@ -16,13 +17,13 @@ float RoundHalfUp(float value) {
   return static_cast<float>(static_cast<std::uint64_t>(static_cast<double>(value) + 0.5));
 }
 
-constexpr std::uint32_t kAddressHeading = 141;
-constexpr std::uint32_t kDhcpWarning = 142;
-constexpr std::uint32_t kAuditWarning = 143;
-constexpr std::uint32_t kQualifierDhcp = 263;
-constexpr std::uint32_t kQualifierStatic = 264;
-constexpr std::uint32_t kQualifierAutoconf = 265;
-constexpr std::uint32_t kQualifierWaiting = 266;
+constexpr std::uint32_t kAddressHeading = TextId::kToManageThisHost;
+constexpr std::uint32_t kDhcpWarning = TextId::kDhcpWarning;
+constexpr std::uint32_t kAuditWarning = TextId::kAuditModeWarning;
+constexpr std::uint32_t kQualifierDhcp = TextId::kDhcp;
+constexpr std::uint32_t kQualifierStatic = TextId::kStatic;
+constexpr std::uint32_t kQualifierAutoconf = TextId::kAutoconf;
+constexpr std::uint32_t kQualifierWaiting = TextId::kWaitingForDhcp;
 
 std::string Qualifier(StringFactory& strings, std::uint32_t id) {
   return std::string("(") + strings.GetString(id) + ")";
@@ -148,8 +149,9 @@ std::string WelcomeSummary::ProcessorAndMemory(const WelcomeFacts& facts) {
 }
 
 std::string WelcomeSummary::Footer(StringFactory& strings) {
-  return std::string("<F2> {color:dark-grey}") + strings.GetString(0) +
-         "{/color}{align:right}<F12> {color:dark-grey}" + strings.GetString(1) + "{/color}{/align}";
+  return std::string("<F2> {color:dark-grey}") + strings.GetString(TextId::kWelcomeCustomizeKey) +
+         "{/color}{align:right}<F12> {color:dark-grey}" +
+         strings.GetString(TextId::kWelcomeShutdownKey) + "{/color}{/align}";
 }
 
 }  // namespace Tulk

@@ -7,7 +7,7 @@
 #include <string_view>
 #include <vector>
 
-#include "screens/WelcomeFacts.h"
+#include "host/WelcomeFacts.h"
 
 namespace Tulk {
 

@@ -6,9 +6,10 @@
 #include <cstdlib>
 
 #include "host/AuditLog.h"
+#include "host/SystemSettings.h"
 #include "include/ColorNumbers.h"
 #include "include/ProcessFlags.h"
-#include "platform/api/SystemInfoImpl.h"
+#include "render/TextId.h"
 #include "runtime/KeyInput.h"
 #include "runtime/Palette.h"
 #include "runtime/SystemLog.h"
@@ -23,8 +24,6 @@
 
 namespace Tulk {
 namespace {
-
-constexpr std::uint32_t kVersionLine = 2;
 
 // The no-adapter alert goes to the host once per process.
 bool g_noAdapterAlertSent = false;
@@ -42,7 +41,7 @@ void WelcomeWindow::ReloadHostInfo() {
 
 void WelcomeWindow::DrawSummary() {
   DrawBatch batch;
-  const std::string message = HykCtl::System::SystemInfoImpl().GetWelcomeMessage();
+  const std::string message = ReadWelcomeMessage();
   if (!message.empty()) {
     ShowCustomMessage(message);
   } else {
@@ -104,11 +103,11 @@ void WelcomeWindow::FillSummary() {
   const WelcomeFacts facts = ReadWelcomeFacts();
   warningArea_->SetText(WelcomeSummary::Warning(facts, strings));
   if (!facts.hasPhysicalNics && !g_noAdapterAlertSent) {
-    HykCtl::System::SystemInfoImpl().SetSystemAlert(WelcomeSummary::kNoAdapterAlert);
+    RaiseSystemAlert(WelcomeSummary::kNoAdapterAlert);
     g_noAdapterAlertSent = true;
   }
   addressBlock_->SetText(WelcomeSummary::AddressBlock(facts, strings));
-  versionLine_->SetText(Text(kVersionLine));
+  versionLine_->SetText(Text(TextId::kVersionLine));
   hardwareLine_->SetText(WelcomeSummary::HardwareLine(facts.vendor, facts.product));
   processorMemory_->SetText(WelcomeSummary::ProcessorAndMemory(facts));
 }

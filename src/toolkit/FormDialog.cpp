@@ -209,7 +209,7 @@ int FormDialog::Run() {
         Move(true);
       } else if (Accept()) {
         ShowCursor(false);
-        return 1;
+        return acceptResult_;
       }
     }
   }

@@ -129,6 +129,9 @@ class FormDialog : public Dialog {
   /// Shows the message dialog titled with catalogue text `titleId` with text
   /// `textId`, then makes `field` current. Returns false, for Accept().
   bool Reject(const Item& field, std::uint32_t titleId, std::uint32_t textId);
+  /// What Run() returns when Accept() closes the form (1 unless set): a
+  /// form that closes after reporting a host failure may return 0.
+  void SetAcceptResult(int result) { acceptResult_ = result; }
 
  private:
   void Move(bool down);
@@ -142,6 +145,7 @@ class FormDialog : public Dialog {
   bool tabMoves_ = false;
   bool enterAdvances_ = false;
   bool cursorAlways_ = false;
+  int acceptResult_ = 1;
 };
 
 }  // namespace Tulk

@@ -3,7 +3,7 @@
 /// text (render/StringFactory.h), its message free text. Only Enter closes
 /// it; Esc and every other key are ignored. Its result is always 1.
 ///
-///   MessageDialog error(this, 162, Text(164));
+///   MessageDialog error(this, TextId::kPasswordErrorTitle, Text(TextId::kOldPasswordIncorrect));
 ///   RunFrame(&error);
 ///
 /// The size is the caller's choice. The default, 60 x 11 with a header of

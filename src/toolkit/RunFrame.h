@@ -1,9 +1,8 @@
 #pragma once
 /// Runs a frame modally.
 ///
-///   auto* dialog = new MessageDialog(this, 162, Text(165));
-///   RunFrame(dialog);
-///   delete dialog;
+///   auto* dialog = new MessageDialog(this, TextId::kPasswordErrorTitle,
+///   Text(TextId::kPasswordMismatch)); RunFrame(dialog); delete dialog;
 ///
 /// The owner is dimmed while the frame runs and drawn active again
 /// afterwards; `currentWindow` (include/ProcessFlags.h) names the frame

@@ -8,8 +8,6 @@
 
 namespace Tulk {
 
-class StringFactory;
-
 struct ManagementNetworkView {
   /// A management kernel NIC exists.
   bool found = false;
@@ -29,15 +27,5 @@ struct ManagementNetworkView {
 /// error level as "Getting management network settings failed: %s" and
 /// leaves the fields read so far.
 ManagementNetworkView ReadManagementNetworkView();
-
-/// The description pane text of "Configure Management Network" for the
-/// view (GeneralWindow.h describes the arrangement), with the labels from
-/// `strings` ("Hostname" 42, "IPv4 Address" 37, "Not set" 120, the DHCP
-/// line 33, "IPv6 Addresses" 38) and ending with description 25. Values
-/// are indented by two blanks when that still fits in `width` columns (a
-/// long IPv6 address on a narrow screen starts at the left edge instead of
-/// wrapping away from its indent).
-std::string FormatManagementNetworkView(const ManagementNetworkView& view, StringFactory& strings,
-                                        int width);
 
 }  // namespace Tulk

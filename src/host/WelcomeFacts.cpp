@@ -1,9 +1,9 @@
-#include "screens/WelcomeFacts.h"
+#include "host/WelcomeFacts.h"
 
 #include "host/ManagementNetwork.h"
+#include "host/NetworkInventory.h"
 #include "include/Constants.h"
 #include "platform/api/CpuInfoImpl.h"
-#include "platform/api/DnsConfigImpl.h"
 #include "platform/api/HardwareInfoImpl.h"
 #include "platform/api/MemoryInfoImpl.h"
 #include "platform/api/NetworkInfoImpl.h"
@@ -27,7 +27,10 @@ WelcomeFacts ReadWelcomeFacts() {
   }
   HykCtl::Network::NetworkInfoImpl network;
   facts.kernelIpv6Enabled = network.IsHykIpv6Enabled();
-  facts.hostname = HykCtl::Network::DnsConfigImpl(kDefaultTcpipStack).GetHostname();
+  facts.hostname = GetHostName();
+  if (facts.hostname == kNotAvailable) {
+    facts.hostname.clear();  // an unreadable name offers no address line
+  }
   facts.hasPhysicalNics = !network.GetPnics().empty();
 
   unsigned char bootOption[3] = {};
