@@ -11,10 +11,10 @@
 
 #include <vector>
 
-#include "host/PnicRow.h"
-#include "host/SwitchSummary.h"
 #include "host/HykNicInfo.h"
+#include "host/PnicRow.h"
 #include "host/PortGroupInfo.h"
+#include "host/SwitchSummary.h"
 
 namespace Tulk {
 

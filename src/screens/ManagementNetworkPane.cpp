@@ -18,7 +18,8 @@ std::string FormatManagementNetworkView(const ManagementNetworkView& view, Strin
   };
   std::string text = label(TextId::kHostnameLabel) + value(view.hostname) + "\n";
   text +=
-      label(TextId::kIpv4AddressLabel) + value(view.ipv4Address == "0.0.0.0" ? strings.GetString(TextId::kNotSet) : view.ipv4Address);
+      label(TextId::kIpv4AddressLabel) +
+      value(view.ipv4Address == "0.0.0.0" ? strings.GetString(TextId::kNotSet) : view.ipv4Address);
   if (view.dhcp) {
     text += std::string(strings.GetString(TextId::kDhcpIdentity)) + "\n";
   }

@@ -3,11 +3,11 @@
 
 #include <string>
 
+#include "host/HykNicInfo.h"
+#include "host/PortGroupInfo.h"
 #include "render/MarkupLayout.h"
 #include "toolkit/CarouselRadioItem.h"
-#include "host/HykNicInfo.h"
 #include "toolkit/InfoDialog.h"
-#include "host/PortGroupInfo.h"
 
 namespace {
 

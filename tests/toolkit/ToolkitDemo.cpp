@@ -19,6 +19,7 @@
 #include <string>
 #include <vector>
 
+#include "host/PortGroupInfo.h"
 #include "include/ColorNumbers.h"
 #include "include/Keys.h"
 #include "include/ProcessFlags.h"
@@ -32,7 +33,6 @@
 #include "toolkit/ItemList.h"
 #include "toolkit/LabelItem.h"
 #include "toolkit/MessageDialog.h"
-#include "host/PortGroupInfo.h"
 #include "toolkit/RootWindow.h"
 #include "toolkit/RunFrame.h"
 #include "toolkit/TextArea.h"
