@@ -1,10 +1,14 @@
-// Key handling of an input field: the first bytes choose the row and field
-// widths and the initial value, the rest is a sequence of keys (editing
-// keys and printable bytes). After every key the state must stay
-// consistent and the row must format with the cursor inside the field.
+// Key handling of an input field behind its key filter: the first bytes
+// choose the row and field widths, the filter, the length limit and the
+// initial value, the rest is a sequence of keys (editing keys and
+// printable bytes). Keys the filter refuses never reach the field. After
+// every key the state must stay consistent, the value must hold only what
+// the filter takes and no more than the limit, and the row must format
+// with the cursor inside the field.
 
 #include <curses.h>
 
+#include <algorithm>
 #include <cstddef>
 #include <cstdint>
 #include <cstdlib>
@@ -13,6 +17,7 @@
 #include "include/Keys.h"
 #include "render/MarkupLayout.h"
 #include "toolkit/InputField.h"
+#include "toolkit/KeyFilter.h"
 
 namespace {
 
@@ -20,6 +25,11 @@ constexpr int kSpecialKeys[] = {
     KEY_HOME,        KEY_LEFT, KEY_RIGHT, KEY_END,  KEY_DC, KEY_BACKSPACE,
     Tulk::kKeyCtrlH, KEY_F(1), KEY_UP,    KEY_DOWN, 10,     27,
     KEY_IC,          0x7f,     0,         255,
+};
+
+const Tulk::KeyFilter* const kFilters[] = {
+    &Tulk::kAnyText,   &Tulk::kLoginText,   &Tulk::kDigits,   &Tulk::kIpv4,
+    &Tulk::kDnsServer, &Tulk::kIpv6Network, &Tulk::kHostName, &Tulk::kSuffixes,
 };
 
 void Check(bool condition) {
@@ -31,26 +41,42 @@ void Check(bool condition) {
 }  // namespace
 
 extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size) {
-  if (size < 4) {
+  if (size < 5) {
     return 0;
   }
   const int rowWidth = 1 + data[0] % 120;
   const int fieldWidth = static_cast<int>(data[1] % 64) - 1;
   const std::size_t valueLength = data[2] % 40;
   const bool masked = (data[3] & 1) != 0;
-  std::size_t at = 4;
+  const Tulk::KeyFilter& filter = *kFilters[(data[3] >> 1) % 8];
+  const std::size_t maxLength = data[4] % 8;  // 0: no limit
+  std::size_t at = 5;
   std::string value;
   while (value.size() < valueLength && at < size) {
-    value += static_cast<char>(data[at++]);
+    const char byte = static_cast<char>(data[at++]);
+    if (filter.Accepts(static_cast<unsigned char>(byte)) && byte >= 0x20) {
+      value += byte;
+    }
   }
   Tulk::InputField state = Tulk::InputField::WithValue(value);
+  state.maxLength = maxLength;
+  const std::size_t longest = std::max(maxLength, value.size());
   const std::string label = "Name:";
   while (at < size) {
     std::uint8_t byte = data[at++];
     int key = byte < 0x20 ? kSpecialKeys[byte % 16] : byte;
+    if (!filter.Accepts(key)) {
+      continue;
+    }
     state = Tulk::InputField::HandleKey(state, key);
     Check(state.cursor <= state.value.size());
     Check(!state.pristine);
+    for (char c : state.value) {
+      Check(filter.Accepts(static_cast<unsigned char>(c)));
+    }
+    if (maxLength != 0) {
+      Check(state.value.size() <= longest);
+    }
 
     Tulk::InputField::Row row =
         Tulk::InputField::FormatRow(state, label, rowWidth, fieldWidth, true, masked);

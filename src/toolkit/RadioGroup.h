@@ -6,7 +6,8 @@
 ///
 ///   RadioGroup mode;
 ///   mode.Add(&dhcp);
-///   mode.Add(&fixed, {&address, &mask, &gateway});
+///   mode.Add(&fixed);
+///   mode.SetDependents(&fixed, {&address, &mask, &gateway});
 ///   mode.Select(&fixed);  // marks it alone, enables the three inputs
 ///
 /// The group neither owns nor draws its items: the form (FormDialog.h) calls
@@ -26,6 +27,10 @@ class RadioGroup {
   /// follow it. The first button added is marked until Select() says
   /// otherwise.
   void Add(RadioItem* radio, std::vector<Item*> dependents = {});
+
+  /// Makes `dependents` follow `radio` (replacing what followed it before)
+  /// and applies the enabling rule.
+  void SetDependents(const Item* radio, std::vector<Item*> dependents);
 
   /// Marks `radio` alone and applies the enabling rule. Ignored when the
   /// button is not in the group.

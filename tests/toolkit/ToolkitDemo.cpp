@@ -8,6 +8,9 @@
 //   menu      a root window with a menu (a separator, a disabled entry)
 //   input     a dialog with a login name and a masked password field
 //   carousel  a dialog with a carousel over portgroups
+//   form      a form with two radio buttons and a digits-only VLAN field
+//   confirm   an F11 question with a check box; yesno: a Y/N/Esc question
+//   progress  a report whose step is a worker thread reading a FIFO
 // The home frame shows "result: N" after the scene (or that the idle
 // timeout ended it) and "key: K" for every key it receives; "o" opens the
 // scene again, "q" ends the program.
@@ -15,24 +18,37 @@
 #include <curses.h>
 
 #include <cstdlib>
+#include <fstream>
 #include <memory>
 #include <string>
+#include <thread>
+#include <utility>
 #include <vector>
 
 #include "host/PortGroupInfo.h"
+#include "host/VlanInput.h"
 #include "include/ColorNumbers.h"
 #include "include/Keys.h"
 #include "include/ProcessFlags.h"
 #include "render/HostValues.h"
+#include "render/TextId.h"
 #include "runtime/Console.h"
 #include "runtime/KeyInput.h"
+#include "runtime/WorkerResult.h"
 #include "toolkit/CarouselRadioItem.h"
+#include "toolkit/CheckItem.h"
+#include "toolkit/ConfirmDialog.h"
 #include "toolkit/Dialog.h"
+#include "toolkit/FormDialog.h"
 #include "toolkit/InfoDialog.h"
 #include "toolkit/InputItem.h"
 #include "toolkit/ItemList.h"
 #include "toolkit/LabelItem.h"
+#include "toolkit/MenuWindow.h"
 #include "toolkit/MessageDialog.h"
+#include "toolkit/ProgressDialog.h"
+#include "toolkit/RadioGroup.h"
+#include "toolkit/RadioItem.h"
 #include "toolkit/RootWindow.h"
 #include "toolkit/RunFrame.h"
 #include "toolkit/TextArea.h"
@@ -41,98 +57,119 @@ namespace {
 
 using namespace Tulk;
 
-class DemoMenu : public RootWindow {
+class DemoMenu : public MenuWindow {
  public:
-  explicit DemoMenu(Frame* owner) : RootWindow(owner) {
-    const char* labels[] = {"Configure Password", "Configure Lockdown Mode", "",
-                            "Restart Management Network", "View System Logs"};
-    for (const char* label : labels) {
-      entries_.push_back(std::make_unique<LabelItem>(label));
+  explicit DemoMenu(Frame* owner) : MenuWindow(owner) {
+    SetMenuTitle("Demo Menu");
+    const std::pair<const char*, bool> rows[] = {{"Configure Password", true},
+                                                 {"Configure Lockdown Mode", true},
+                                                 {"", false},
+                                                 {"Restart Management Network", false},
+                                                 {"View System Logs", true}};
+    std::vector<MenuEntry> entries;
+    for (const auto& [label, enabled] : rows) {
+      MenuEntry entry;
+      entry.label = label;
+      entry.enabled = enabled;
+      entry.describe = [text = std::string(label)] {
+        return "{color:white}Set{/color}\n\nDescription of " + text;
+      };
+      entry.footer = Footer::MenuAction("Change", "Log Out");
+      entry.action = [this, text = std::string(label)] {
+        MessageDialog opened(this, TextId::kOperationSucceeded, "Opened " + text);
+        RunFrame(&opened);
+        return true;
+      };
+      entries.push_back(std::move(entry));
     }
-    entries_[2]->SetEnabled(false);
-    entries_[3]->SetEnabled(false);
-    entries_[3]->SetText("{color:dark-grey}Restart Management Network{/color}");
+    SetEntries(std::move(entries));
   }
-
-  void Populate() override {
-    SetLeftTitle("Demo Menu");
-    std::vector<Item*> items;
-    for (auto& entry : entries_) {
-      items.push_back(entry.get());
-    }
-    Menu().SetItems(items);
-    Menu().Draw();
-    ShowDescription();
-  }
-
-  int Run() override {
-    Show();
-    for (;;) {
-      int key = WaitForKey(this, true);
-      if (key == KEY_DOWN || key == KEY_UP) {
-        if (key == KEY_DOWN ? Menu().MoveDown() : Menu().MoveUp()) {
-          ShowDescription();
-        }
-      } else if (key == kKeyEsc) {
-        return 1;
-      }
-    }
-  }
-
- private:
-  void ShowDescription() {
-    auto* current = static_cast<LabelItem*>(Menu().Current());
-    SetRightTitle(current->Label());
-    Description().SetText("{color:white}Set{/color}\n\nDescription of " + current->Label());
-    SetRightFooter(
-        "{color:white}<Enter>{/color}{color:light-grey} Change{/color}{align:right}"
-        "{color:white}<Esc>{/color}{color:light-grey} Log Out{/color}{/align}");
-  }
-
-  std::vector<std::unique_ptr<LabelItem>> entries_;
 };
 
-class InputDemo : public Dialog {
+class InputDemo : public FormDialog {
  public:
-  explicit InputDemo(Frame* owner)
-      : Dialog(owner, 60, 13, 6), name_("Login Name:", "root", 30), password_("Password:", "", 30) {
+  explicit InputDemo(Frame* owner) : FormDialog(owner, 60, 13, 6) {
     SetTitle("Authentication Required");
     SetText("Enter an authorized login name and password for demo.");
     SetFooter(Footer::kOkCancel);
-    password_.SetMasked(true);
-    list_ = new ItemList(Content(), 0, 0, Content()->Width(), 2);
-    list_->SetItems({&name_, &password_});
+    name_ = &AddInput("Login Name:", "root", 30);
+    password_ = &AddInput("Password:", "", 30);
+    password_->SetMasked(true);
+    PlaceList(0, 0, Content()->Width(), 2);
+  }
+
+  std::string Values() const { return name_->Value() + "/" + password_->Value(); }
+
+ private:
+  InputItem* name_;
+  InputItem* password_;
+};
+
+// A VLAN form: the id is taken only in manual mode, digits only, at most
+// four; Enter checks it with the shared rule.
+class FormDemo : public FormDialog {
+ public:
+  explicit FormDemo(Frame* owner) : FormDialog(owner, 70, 14, 6) {
+    SetTitle(Text(TextId::kVlanOptional));
+    SetText(Text(TextId::kVlanText));
+    SetFooter(Footer::kSelectMarkOkCancel);
+    AddRadio(mode_, "No VLAN");
+    auto& manual = AddRadio(mode_, "This VLAN:");
+    vlan_ = &AddInput(Text(TextId::kVlanLabel), "", 6, kDigits, 4);
+    mode_.SetDependents(&manual, {vlan_});
+  }
+
+  std::string Values() const {
+    return std::string(mode_.SelectedIndex() == 0 ? "none" : "vlan ") +
+           (mode_.SelectedIndex() == 0 ? "" : vlan_->Value());
+  }
+
+ protected:
+  bool Accept() override {
+    if (mode_.SelectedIndex() == 1 &&
+        VlanInput::Parse(vlan_->Value()).kind == VlanInput::Kind::kInvalid) {
+      return Reject(*vlan_, TextId::kInvalidVlanTitle, TextId::kInvalidVlan);
+    }
+    return true;
+  }
+
+ private:
+  RadioGroup mode_;
+  InputItem* vlan_;
+};
+
+// A progress report whose one step is a worker: the worker reads its
+// outcome from the FIFO <TULK_ROOT>/tmp/worker ("0" succeeds).
+class ProgressDemo : public ProgressDialog {
+ public:
+  explicit ProgressDemo(Frame* owner) : ProgressDialog(owner, 60, 12, 7) {
+    SetTitle("Demo Progress");
+    SetText("Please wait.");
+    SetFooter(Footer::kCancel);
   }
 
   int Run() override {
-    ShowCursor(true);
-    list_->Draw();
-    int result = 0;
+    Append("Waiting for the worker. ");
+    auto result = WorkerResult::Create();
+    const char* root = std::getenv("TULK_ROOT");
+    std::thread([result, path = std::string(root != nullptr ? root : "") + "/tmp/worker"] {
+      std::ifstream in(path);
+      int value = 1;
+      in >> value;
+      result->Set(value);
+    }).detach();
     for (;;) {
-      int key = WaitKey();
-      if (key == kKeyEnter || key == kKeyEsc) {
-        result = key == kKeyEnter ? 1 : 0;
+      const int key = WaitKeyOrResult(*result);
+      if (key == kKeyEsc) {
+        return 0;
+      }
+      if (key == kKeyResultReady) {
         break;
       }
-      if (key == KEY_DOWN) {
-        list_->MoveDown();
-      } else if (key == KEY_UP) {
-        list_->MoveUp();
-      } else {
-        static_cast<InputItem*>(list_->Current())->HandleKey(key);
-        list_->Draw();
-      }
     }
-    ShowCursor(false);
-    return result;
+    AppendOutcome(result->Get() == 0);
+    return Finish(Footer::kProgressOk);
   }
-
-  std::string Values() const { return name_.Value() + "/" + password_.Value(); }
-
- private:
-  InputItem name_;
-  InputItem password_;
-  ItemList* list_;
 };
 
 using PortGroupCarousel = CarouselRadioItem<PortGroupInfo, InfoDialog>;
@@ -219,7 +256,8 @@ class DemoHome : public Frame {
     int result = 0;
     std::string detail;
     if (name == "message") {
-      MessageDialog dialog(this, 162, "The new password and the confirmed password do not match.");
+      MessageDialog dialog(this, TextId::kPasswordErrorTitle,
+                           "The new password and the confirmed password do not match.");
       result = RunFrame(&dialog);
     } else if (name == "menu") {
       DemoMenu menu(this);
@@ -228,6 +266,26 @@ class DemoHome : public Frame {
       InputDemo dialog(this);
       result = RunFrame(&dialog);
       detail = " values: " + dialog.Values();
+    } else if (name == "form") {
+      FormDemo dialog(this);
+      result = RunFrame(&dialog);
+      detail = " values: " + dialog.Values();
+    } else if (name == "confirm" || name == "yesno") {
+      const bool f11 = name == "confirm";
+      ConfirmDialog dialog(this, 60, 14, 6, f11 ? ConfirmKeys::kF11 : ConfirmKeys::kYesNo);
+      dialog.SetTitle("Demo Question");
+      dialog.SetQuestion("Go ahead?");
+      dialog.SetFooter(f11 ? Footer::kF11OkCancel : Footer::kYesNoCancel);
+      if (f11) {
+        dialog.AddCheck("Collect extra information", 0, 2, 40);
+      }
+      result = RunFrame(&dialog);
+      if (dialog.Check() != nullptr) {
+        detail = dialog.Check()->Checked() ? " checked" : " unchecked";
+      }
+    } else if (name == "progress") {
+      ProgressDemo dialog(this);
+      result = RunFrame(&dialog);
     } else if (name == "carousel") {
       CarouselDemo dialog(this);
       result = RunFrame(&dialog);
