@@ -26,8 +26,7 @@ class MessageDialog : public Dialog {
   /// Enter; returns 1.
   int Run() override;
 
-  /// The title's catalogue number and the message.
-  std::uint32_t TitleId() const { return titleId_; }
+  /// The message.
   const std::string& Message() const { return message_; }
 
  private:
