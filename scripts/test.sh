@@ -1,6 +1,8 @@
 #!/usr/bin/env bash
 # Installs what is missing, builds, and runs the whole test suite:
-#   1. default build (warnings as errors): unit and screen tests;
+#   1. default build (warnings as errors): unit and screen tests, then the
+#      installation: staged install, systemd units verified and rated,
+#      manual page (scripts/check-deploy.sh);
 #   2. sanitizer build (AddressSanitizer + UndefinedBehaviorSanitizer): the
 #      same tests again;
 #   3. a short libFuzzer run of every fuzz target (60 s each when CI=true,
@@ -25,6 +27,8 @@ jobs=$(nproc)
 echo "== default build: unit and screen tests"
 scripts/build.sh default
 ctest --preset default -j "$jobs"
+echo "== installation: staged install, systemd units, manual page"
+scripts/check-deploy.sh build/default
 
 if ((run_asan)); then
   echo "== sanitizer build (ASan + UBSan): unit and screen tests"
