@@ -6,7 +6,10 @@
 #   1. the console survives ten Ctrl-C in a row: after each one the unit
 #      starts a new console process, which draws the welcome screen again,
 #      and the unit ends active with ten restarts and no start limit hit;
-#   2. the unit's sandbox leaves the host operations working: a process in
+#   2. a restart leaves nothing behind: a tool that ignores SIGTERM and
+#      SIGHUP, still running when the unit's main process ends, is gone
+#      before the next start;
+#   3. the unit's sandbox leaves the host operations working: a process in
 #      the same sandbox writes /etc/hosts and its backup, changes a user's
 #      password through PAM (chpasswd over common-password), starts and stops
 #      a service through systemctl, runs the pager on a terminal, and finally
@@ -39,19 +42,8 @@ die() {
   exit 1
 }
 
-# What the check needs on this machine.
-missing=()
-for package in debootstrap systemd-container util-linux; do
-  dpkg-query -W -f='${Status}' "$package" 2>/dev/null | grep -q "install ok installed" ||
-    missing+=("$package")
-done
-if ((${#missing[@]})); then
-  say "installing ${missing[*]}"
-  DEBIAN_FRONTEND=noninteractive apt-get install -y -qq --no-install-recommends "${missing[@]}" \
-    >/dev/null
-fi
-
-# The console and the simulated host's tool.
+# What the check needs (debootstrap, systemd-nspawn), the console and the
+# simulated host's tool.
 say "building"
 scripts/setup.sh >/dev/null
 scripts/build.sh default --target tulk tulk-hosttool >/dev/null
@@ -86,8 +78,9 @@ EOF
 systemctl --root="$root" --quiet enable "$unit"
 systemctl --root="$root" --quiet mask console-getty.service
 
-# The sandbox probe: the same unit, instance "probe", running a script in
-# place of the console; instance "power" powers the container off.
+# The same unit with other programs in place of the console: instance
+# "stray" leaves a hung tool behind and ends; instance "probe" runs the
+# sandbox probe; instance "power" powers the container off.
 cat >"$root/usr/local/sbin/tulk-sandbox-probe" <<'EOF'
 #!/bin/sh
 set -e
@@ -108,10 +101,25 @@ printf 'q' | script -qec 'TERM=vt100 less /etc/os-release' /dev/null >/dev/null
 echo "probe: the pager ran on a terminal"
 echo "probe: all fine"
 EOF
-chmod 755 "$root/usr/local/sbin/tulk-sandbox-probe"
-for instance in probe power; do
+cat >"$root/usr/local/sbin/tulk-hung-tool" <<'EOF'
+#!/bin/sh
+# Leaves behind a tool that ignores SIGTERM and SIGHUP, and ends.
+sh -c 'trap "" TERM HUP; exec sleep 1000' &
+echo $! >/run/tulk-stray.pid
+sleep 1
+EOF
+chmod 755 "$root/usr/local/sbin/tulk-sandbox-probe" "$root/usr/local/sbin/tulk-hung-tool"
+for instance in stray probe power; do
   mkdir -p "$root/etc/systemd/system/tulk-serial@$instance.service.d"
 done
+cat >"$root/etc/systemd/system/tulk-serial@stray.service.d/stray.conf" <<'EOF'
+[Service]
+StandardInput=null
+StandardOutput=journal
+ExecStartPre=
+ExecStart=
+ExecStart=/usr/local/sbin/tulk-hung-tool
+EOF
 cat >"$root/etc/systemd/system/tulk-serial@probe.service.d/probe.conf" <<'EOF'
 [Service]
 Type=oneshot
@@ -217,6 +225,23 @@ result=$(show "$unit" Result)
 say "after ten Ctrl-C: $state, result $result, $restarts restarts"
 [[ $restarts == 10 && $state == active/running && $result == success ]] ||
   die "the unit did not come back ten times"
+
+say "a hung tool left behind by the unit's program"
+stray=tulk-serial@stray.service
+stray_pid() { inside cat /run/tulk-stray.pid 2>/dev/null || true; }
+has_stray() { [[ -n $(stray_pid) ]]; }
+restarted() { [[ $(show "$stray" NRestarts) -ge 1 ]] && has_stray; }
+gone() { ! inside kill -0 "$1" 2>/dev/null; }
+inside systemctl start "$stray"
+wait_for 30 "the hung tool" has_stray
+first=$(stray_pid)
+inside rm -f /run/tulk-stray.pid
+wait_for 60 "the unit's restart" restarted
+gone "$first" || die "the hung tool $first outlived the restart"
+second=$(stray_pid)
+inside systemctl stop "$stray"
+gone "$second" || die "the hung tool $second outlived the stop"
+say "the hung tools $first and $second ended with the unit's restart and stop"
 
 say "the sandbox probe"
 if ! inside systemctl start tulk-serial@probe.service; then
