@@ -10,6 +10,7 @@ PACKAGES=(
   nlohmann-json3-dev libgtest-dev libgmock-dev libvterm-dev libpam-wrapper libbenchmark-dev
   clang libclang-rt-14-dev
   less openssl openssh-client locales procps
+  systemd man-db debootstrap systemd-container
 )
 
 SUDO=()

@@ -1,21 +1,28 @@
 #!/usr/bin/env bash
 # Installs what is missing, builds, and runs the whole test suite:
-#   1. default build (warnings as errors): unit and screen tests;
+#   1. default build (warnings as errors): unit and screen tests, then the
+#      installation: staged install, systemd units verified and rated,
+#      manual page (scripts/check-deploy.sh), and the console under systemd
+#      in a Debian 12 container: ten Ctrl-C, the sandbox's operations
+#      (scripts/check-container.sh; as root only);
 #   2. sanitizer build (AddressSanitizer + UndefinedBehaviorSanitizer): the
 #      same tests again;
 #   3. a short libFuzzer run of every fuzz target (60 s each when CI=true,
 #      10 s otherwise; TULK_FUZZ_SECONDS overrides).
-# Options: --no-asan and --no-fuzz skip steps 2 and 3 (for quick local runs).
+# Options: --no-asan and --no-fuzz skip steps 2 and 3, --no-container the
+# container check (for quick local runs).
 set -euo pipefail
 cd "$(dirname "$0")/.."
 
 run_asan=1
 run_fuzz=1
+run_container=1
 for argument in "$@"; do
   case "$argument" in
     --no-asan) run_asan=0 ;;
     --no-fuzz) run_fuzz=0 ;;
-    *) echo "usage: scripts/test.sh [--no-asan] [--no-fuzz]" >&2; exit 2 ;;
+    --no-container) run_container=0 ;;
+    *) echo "usage: scripts/test.sh [--no-asan] [--no-fuzz] [--no-container]" >&2; exit 2 ;;
   esac
 done
 
@@ -25,6 +32,16 @@ jobs=$(nproc)
 echo "== default build: unit and screen tests"
 scripts/build.sh default
 ctest --preset default -j "$jobs"
+echo "== installation: staged install, systemd units, manual page"
+scripts/check-deploy.sh build/default
+if ((run_container)); then
+  if [[ $(id -u) -eq 0 ]]; then
+    echo "== the console under systemd in a Debian 12 container"
+    scripts/check-container.sh
+  else
+    echo "== container check skipped: it needs root"
+  fi
+fi
 
 if ((run_asan)); then
   echo "== sanitizer build (ASan + UBSan): unit and screen tests"

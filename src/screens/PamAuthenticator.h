@@ -18,6 +18,19 @@
 /// Results are PAM status codes (security/pam_appl.h): PAM_SUCCESS (0),
 /// PAM_NEW_AUTHTOK_REQD (12, the password has expired), PAM_PERM_DENIED
 /// (6), or any other failure.
+///
+/// Decisions of this implementation:
+/// - No PAM session is opened (no pam_open_session/pam_close_session around
+///   a logged-in session), and the shipped service file has no session
+///   line. The console never changes its identity or starts a user's
+///   programs, so session modules would have nothing to set up, and some
+///   (pam_systemd) would move the long-lived console out of its service
+///   into a user session. The session is recorded by the console's own log
+///   lines and audit records ("tulk.login", "tulk.logout").
+/// - Failed attempts are slowed down by the service's modules (pam_faildelay
+///   in dist/pam.d/tulk), not here: no PAM_FAIL_DELAY callback is set, so
+///   PAM waits inside pam_authenticate and the failure is shown afterwards;
+///   keys typed meanwhile wait in the terminal.
 
 #include <string>
 
