@@ -29,6 +29,9 @@ done
 scripts/setup.sh
 jobs=$(nproc)
 
+echo "== layers: includes point downwards only"
+scripts/check-layers.sh
+
 echo "== default build: unit and screen tests"
 scripts/build.sh default
 ctest --preset default -j "$jobs"

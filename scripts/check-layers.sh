@@ -1,0 +1,34 @@
+#!/usr/bin/env bash
+# Checks that the source folders include one another only downwards:
+#   runtime, render  <- toolkit
+#   runtime, render  <- host <- platform (the host-control API)
+#   host, toolkit    <- network, restore, troubleshooting <- screens
+# and that only host and platform itself name the host-control API.
+# Prints every include that points the wrong way; exits 1 if there is one.
+set -euo pipefail
+cd "$(dirname "$0")/../src"
+
+declare -A allowed=(
+  [runtime]="runtime include"
+  [render]="render runtime include"
+  [toolkit]="toolkit render runtime include"
+  [host]="host render runtime include platform"
+  [network]="network host toolkit render runtime include"
+  [restore]="restore host toolkit render runtime include"
+  [troubleshooting]="troubleshooting host toolkit render runtime include"
+  [screens]="screens network restore troubleshooting host toolkit render runtime include"
+)
+
+status=0
+for folder in "${!allowed[@]}"; do
+  [[ -d $folder ]] || continue
+  while IFS=: read -r file line include; do
+    target=${include#*\"}
+    target=${target%%/*}
+    if [[ " ${allowed[$folder]} " != *" $target "* ]]; then
+      echo "layer violation: $file:$line includes \"${include#*\"}" >&2
+      status=1
+    fi
+  done < <(grep -rn '^#include "[a-z]*/' "$folder" | sed 's/:#include /:/' || true)
+done
+exit $status
