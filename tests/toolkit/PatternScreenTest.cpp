@@ -137,14 +137,27 @@ TEST(PatternScreen, YesNoQuestionAnswersWithTheLettersOnly) {
   }
 }
 
+// The progress scene with the FIFO its worker reads, started and showing
+// its step.
+struct ProgressScene {
+  ProgressScene() : console(Stopped()), fifo((console.Root() / "tmp" / "worker").string()) {
+    EXPECT_EQ(mkfifo(fifo.c_str(), 0600), 0);
+    console.Start();
+    EXPECT_TRUE(console.WaitForText("Waiting for the worker."));
+  }
+  static Options Stopped() {
+    Options options = Scene("progress");
+    options.start = false;
+    return options;
+  }
+  TestConsole console;
+  std::string fifo;
+};
+
 TEST(PatternScreen, WorkerResultWakesTheReportWhichClosesOnEnterOnly) {
-  Options options = Scene("progress");
-  options.start = false;
-  TestConsole console(options);
-  const std::string fifo = (console.Root() / "tmp" / "worker").string();
-  ASSERT_EQ(mkfifo(fifo.c_str(), 0600), 0);
-  console.Start();
-  ASSERT_TRUE(console.WaitForText("Waiting for the worker."));
+  ProgressScene scene;
+  TestConsole& console = scene.console;
+  const std::string& fifo = scene.fifo;
   ASSERT_TRUE(FeedWorker(fifo, "0\n"));
   // No key: the worker's result alone ends the wait.
   ASSERT_TRUE(console.WaitForText("Waiting for the worker. Done."));
@@ -155,13 +168,9 @@ TEST(PatternScreen, WorkerResultWakesTheReportWhichClosesOnEnterOnly) {
 }
 
 TEST(PatternScreen, EscEndsAWaitForAWorkerAtOnce) {
-  Options options = Scene("progress");
-  options.start = false;
-  TestConsole console(options);
-  const std::string fifo = (console.Root() / "tmp" / "worker").string();
-  ASSERT_EQ(mkfifo(fifo.c_str(), 0600), 0);
-  console.Start();
-  ASSERT_TRUE(console.WaitForText("Waiting for the worker."));
+  ProgressScene scene;
+  TestConsole& console = scene.console;
+  const std::string& fifo = scene.fifo;
   console.Key("Esc");
   EXPECT_TRUE(console.WaitForText("result: 0"));
   EXPECT_TRUE(FeedWorker(fifo, "1\n"));  // the worker ends after the dialog has gone
