@@ -129,6 +129,11 @@ class FormDialog : public Dialog {
   /// Shows the message dialog titled with catalogue text `titleId` with text
   /// `textId`, then makes `field` current. Returns false, for Accept().
   bool Reject(const Item& field, std::uint32_t titleId, std::uint32_t textId);
+  /// Shows the message dialog titled with catalogue text `titleId` with text
+  /// `textId` and waits until it is closed; the form's current item stays.
+  /// For forms that report a refused value and still go on (Accept() then
+  /// returns true).
+  void Notify(std::uint32_t titleId, std::uint32_t textId);
 
  private:
   void Move(bool down);
