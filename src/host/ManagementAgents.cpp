@@ -21,8 +21,7 @@ constexpr bool kWaitForExit = true;
 constexpr bool kUseShell = false;
 
 void RunServicesScript(const char* verb) {
-  const std::string line =
-      HostPath("/bin/sh") + " " + HostPath("/sbin/services.sh") + " " + verb;
+  const std::string line = HostPath("/bin/sh") + " " + HostPath("/sbin/services.sh") + " " + verb;
   try {
     HykCtl::Util::HykCtl_Exec(line, kCaptureOutput, kWaitForExit, kUseShell);
   } catch (const HostMgr::Lib::HostMgrException& error) {

@@ -46,8 +46,8 @@ struct RepairService {
 };
 
 /// The local Tavi Shell.
-inline constexpr RepairService kTaviShellService{"Tavi Shell", "/etc/init.d/TavShell",
-                                                 "tav_shell", nullptr};
+inline constexpr RepairService kTaviShellService{"Tavi Shell", "/etc/init.d/TavShell", "tav_shell",
+                                                 nullptr};
 /// The SSH server, whose firewall ruleset is "sshServer".
 inline constexpr RepairService kSshService{"ssh", "/etc/init.d/SSH", "ssh", "sshServer"};
 

@@ -2,12 +2,11 @@
 /// The three timeouts the host keeps as advanced options, in seconds
 /// (0 = off), and the rule for a timeout the operator types in minutes.
 ///
-/// | Option                                  | Meaning                               | Read default |
-/// |-----------------------------------------|---------------------------------------|--------------|
-/// | "/UserVars/TaviShellTimeOut"            | how long after the shell or SSH is    | 0            |
-/// |                                         | enabled a user may still log in       |              |
-/// | "/UserVars/TaviShellInteractiveTimeOut" | idle timeout of shell sessions        | 0            |
-/// | "/UserVars/TulkTimeOut"                 | idle time before the console logs out | 600          |
+/// | Option                                  | Meaning                            | Default |
+/// |-----------------------------------------|------------------------------------|---------|
+/// | "/UserVars/TaviShellTimeOut"            | login still allowed after enabling | 0       |
+/// | "/UserVars/TaviShellInteractiveTimeOut" | idle timeout of shell sessions     | 0       |
+/// | "/UserVars/TulkTimeOut"                 | idle time before a console logout  | 600     |
 ///
 /// The read default is what a read yields when the option cannot be read.
 /// Options are written with SetAdvancedOption() (host/HostTools.h).

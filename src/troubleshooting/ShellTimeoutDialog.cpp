@@ -23,8 +23,8 @@ ShellTimeoutDialog::ShellTimeoutDialog(Frame* owner)
   SetTitle(Text(TextId::kShellTimeoutsTitle));
   SetText(Text(TextId::kShellTimeoutsText));
   SetFooter(Footer::kOkCancel);
-  availability_ = &AddTimeoutField(*this, Text(TextId::kAvailabilityTimeoutLabel),
-                                   availabilityMinutes_);
+  availability_ =
+      &AddTimeoutField(*this, Text(TextId::kAvailabilityTimeoutLabel), availabilityMinutes_);
   idle_ = &AddTimeoutField(*this, Text(TextId::kIdleTimeoutLabel), idleMinutes_);
 }
 

@@ -53,8 +53,7 @@ void TroubleShootingWindow::BuildEntries() {
     const char* action;
   };
   const Row rows[] = {
-      {shellEnabled_ ? TextId::kDisableShell : TextId::kEnableShell, TextId::kShellTitle,
-       "Change"},
+      {shellEnabled_ ? TextId::kDisableShell : TextId::kEnableShell, TextId::kShellTitle, "Change"},
       {sshEnabled_ ? TextId::kDisableSsh : TextId::kEnableSsh, TextId::kSshTitle, "Change"},
       {TextId::kShellTimeouts, TextId::kShellTimeouts, "Change"},
       {TextId::kTulkTimeout, TextId::kTulkTimeout, "Change"},
@@ -91,8 +90,7 @@ std::string TroubleShootingWindow::Describe(std::size_t position) const {
       return std::string("{color:light-grey}") + Text(TextId::kShellTimeoutsDescription) +
              "{/color}";
     case kTulkTimeoutPosition:
-      return std::string("{color:light-grey}") + Text(TextId::kTulkTimeoutDescription) +
-             "{/color}";
+      return std::string("{color:light-grey}") + Text(TextId::kTulkTimeoutDescription) + "{/color}";
     case kRestartAgentsPosition:
       return std::string("{color:light-grey}") + Text(TextId::kRestartAgentsDescription) +
              "{/color}";

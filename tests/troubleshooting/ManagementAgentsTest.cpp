@@ -87,7 +87,8 @@ TEST_F(ManagementAgentsTest, StopAndStartNeverThrow) {
   HostTest::WriteHostState(state_);
   Tulk::StopManagementAgents();
   Tulk::StartManagementAgents();
-  EXPECT_EQ(HostTest::LogLines(), (Lines{"<11>Cannot run services.sh", "<11>Cannot run services.sh"}));
+  EXPECT_EQ(HostTest::LogLines(),
+            (Lines{"<11>Cannot run services.sh", "<11>Cannot run services.sh"}));
 }
 
 TEST_F(ManagementAgentsTest, CaptureLogsOneOfThreeOutcomes) {
@@ -117,8 +118,7 @@ TEST_F(ManagementAgentsTest, CaptureLogsOneOfThreeOutcomes) {
     ASSERT_EQ(cores.size(), c.cores);
     if (!cores.empty()) {
       EXPECT_EQ(cores[0].filename().string().rfind("mgmtd-restart", 0), 0U) << cores[0];
-      EXPECT_EQ(ToolRuns(),
-                Lines{"hykbacktrace -w -n mgmtd -o mgmtd-restart% -d /var/log/"});
+      EXPECT_EQ(ToolRuns(), Lines{"hykbacktrace -w -n mgmtd -o mgmtd-restart% -d /var/log/"});
     }
   }
 }

@@ -108,10 +108,10 @@ TEST_F(RepairServicesTest, OperatorRefusedByTheToolRunsAsTheFallbackUser) {
   // The demo host's "operator" may not use the management-API tool.
   Write();
   Tulk::SwitchService(Tulk::kSshService, false);
-  EXPECT_EQ(ToolRuns(), (Lines{"osk-cmd -U operator hostsvc/start_ssh",
-                               "osk-cmd -U root hostsvc/start_ssh",
-                               "osk-cmd -U operator hostsvc/enable_ssh",
-                               "osk-cmd -U root hostsvc/enable_ssh"}));
+  EXPECT_EQ(
+      ToolRuns(),
+      (Lines{"osk-cmd -U operator hostsvc/start_ssh", "osk-cmd -U root hostsvc/start_ssh",
+             "osk-cmd -U operator hostsvc/enable_ssh", "osk-cmd -U root hostsvc/enable_ssh"}));
   EXPECT_EQ(HostTest::ReadHostState()["services"]["SSH"]["running"], true);
 }
 
@@ -127,15 +127,37 @@ TEST_F(RepairServicesTest, FailedStartOrStopFallsBackToTheInitScript) {
     Lines runs;
   };
   const Case cases[] = {
-      {"shell on", Tulk::kTaviShellService, false, true, false, false,
+      {"shell on",
+       Tulk::kTaviShellService,
+       false,
+       true,
+       false,
+       false,
        FirewallChange::kUntouched,
        {"osk-cmd -U root hostsvc/start_tav_shell", "TavShell start",
         "osk-cmd -U root hostsvc/enable_tav_shell"}},
-      {"ssh on", Tulk::kSshService, false, true, false, true, FirewallChange::kSwitched,
+      {"ssh on",
+       Tulk::kSshService,
+       false,
+       true,
+       false,
+       true,
+       FirewallChange::kSwitched,
        {"osk-cmd -U root hostsvc/start_ssh", "SSH start", "osk-cmd -U root hostsvc/enable_ssh"}},
-      {"ssh off", Tulk::kSshService, true, true, true, false, FirewallChange::kSwitched,
+      {"ssh off",
+       Tulk::kSshService,
+       true,
+       true,
+       true,
+       false,
+       FirewallChange::kSwitched,
        {"osk-cmd -U root hostsvc/stop_ssh", "SSH stop", "osk-cmd -U root hostsvc/disable_ssh"}},
-      {"ssh on, ruleset pinned", Tulk::kSshService, false, false, false, false,
+      {"ssh on, ruleset pinned",
+       Tulk::kSshService,
+       false,
+       false,
+       false,
+       false,
        FirewallChange::kUntouched,
        {"osk-cmd -U root hostsvc/start_ssh", "SSH start", "osk-cmd -U root hostsvc/enable_ssh"}},
   };
@@ -157,8 +179,8 @@ TEST_F(RepairServicesTest, FailedStartOrStopFallsBackToTheInitScript) {
     EXPECT_EQ(host["system"]["firewall"]["sshServer"]["enabled"], c.rulesetAfter);
     EXPECT_EQ(host["services"][&c.service == &Tulk::kSshService ? "SSH" : "TavShell"]["running"],
               !c.on);
-    EXPECT_EQ(Warnings(), Lines{std::string("Unable to run osk-cmd to start/stop ") +
-                                c.service.logName});
+    EXPECT_EQ(Warnings(),
+              Lines{std::string("Unable to run osk-cmd to start/stop ") + c.service.logName});
   }
 }
 

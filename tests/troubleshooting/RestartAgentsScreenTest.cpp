@@ -134,7 +134,7 @@ TEST(RestartAgentsScreenTest, CaptureOutlivesTheDialog) {
     EXPECT_NE(std::find(lines.begin(), lines.end(), c.outcome), lines.end());
     EXPECT_TRUE(console.Running());
     // The console still answers: the dialog opens again.
-    console.Key("o");
+    console.Type("o");
     EXPECT_TRUE(console.WaitForText(kQuestion));
   }
 }

@@ -17,10 +17,14 @@ TEST(TimeoutInputTest, LimitIsOneDayInclusive) {
     std::uint32_t minutes;
   };
   const Case cases[] = {
-      {"", Kind::kEmpty, 0},          {"0", Kind::kValid, 0},
-      {"00000", Kind::kValid, 0},     {"1440", Kind::kValid, 1440},
-      {"01440", Kind::kValid, 1440},  {"1441", Kind::kTooLarge, 0},
-      {"99999", Kind::kTooLarge, 0},  {"00144", Kind::kValid, 144},
+      {"", Kind::kEmpty, 0},
+      {"0", Kind::kValid, 0},
+      {"00000", Kind::kValid, 0},
+      {"1440", Kind::kValid, 1440},
+      {"01440", Kind::kValid, 1440},
+      {"1441", Kind::kTooLarge, 0},
+      {"99999", Kind::kTooLarge, 0},
+      {"00144", Kind::kValid, 144},
       {"4294967296", Kind::kTooLarge, 0},
       {"12a", Kind::kTooLarge, 0},
   };

@@ -13,7 +13,7 @@ using namespace TroubleshootingTest;
 using namespace std::chrono_literals;
 
 constexpr char kSetOption[] = "tavcli system settings advanced set -o ";
-constexpr char kLimitText[] = "Timeout value must be between 0 (disabled) and 1440 minutes";
+constexpr char kLimitText[] = "Timeout value must be between 0 (disabled)";
 
 struct Options {
   std::int64_t availability;
@@ -50,8 +50,7 @@ int CloseLimitMessages(TestConsole& console) {
   int shown = 0;
   while (!console.Contains("result: ")) {
     if (!WaitUntil(
-            console,
-            [&] { return console.Contains(kLimitText) || console.Contains("result: "); },
+            console, [&] { return console.Contains(kLimitText) || console.Contains("result: "); },
             "a message or the result")) {
       break;
     }
@@ -77,20 +76,49 @@ TEST(TimeoutsScreenTest, ShellTimeoutsReachTheHost) {
     int shellRestarts;
   };
   const Case cases[] = {
-      {"availability off restarts the running shell", {1800, 0, 600}, true, {"0"}, 0,
-       {"/UserVars/TaviShellTimeOut -i 0"}, {"Disabled Shell timeout"}, 1},
-      {"idle changed restarts nothing", {0, 0, 600}, true, {"", "15"}, 0,
+      {"availability off restarts the running shell",
+       {1800, 0, 600},
+       true,
+       {"0"},
+       0,
+       {"/UserVars/TaviShellTimeOut -i 0"},
+       {"Disabled Shell timeout"},
+       1},
+      {"idle changed restarts nothing",
+       {0, 0, 600},
+       true,
+       {"", "15"},
+       0,
        {"/UserVars/TaviShellInteractiveTimeOut -i 900"},
-       {"Modified shell interactive timeout to 15 minutes"}, 0},
-      {"1440 accepted, 1441 refused", {0, 600, 600}, false, {"1440", "1441"}, 1,
-       {"/UserVars/TaviShellTimeOut -i 86400"}, {"Modified Shell timeout to 1440 minutes"}, 0},
+       {"Modified shell interactive timeout to 15 minutes"},
+       0},
+      {"1440 accepted, 1441 refused",
+       {0, 600, 600},
+       false,
+       {"1440", "1441"},
+       1,
+       {"/UserVars/TaviShellTimeOut -i 86400"},
+       {"Modified Shell timeout to 1440 minutes"},
+       0},
       {"two refusals in turn", {0, 0, 600}, false, {"1441", "99999"}, 2, {}, {}, 0},
       {"empty fields change nothing", {600, 600, 600}, false, {"<BS>", "<BS>"}, 0, {}, {}, 0},
       {"unchanged minutes are not rewritten", {90, 60, 600}, true, {}, 0, {}, {}, 0},
-      {"a sixth digit and letters are not taken", {0, 0, 600}, false, {"0000a11", "x"}, 0,
-       {"/UserVars/TaviShellTimeOut -i 60"}, {"Modified Shell timeout to 1 minutes"}, 0},
-      {"idle off", {0, 120, 600}, false, {"", "0"}, 0,
-       {"/UserVars/TaviShellInteractiveTimeOut -i 0"}, {"Disabled shell interactive timeout"}, 0},
+      {"a sixth digit and letters are not taken",
+       {0, 0, 600},
+       false,
+       {"0000a11", "x"},
+       0,
+       {"/UserVars/TaviShellTimeOut -i 60"},
+       {"Modified Shell timeout to 1 minutes"},
+       0},
+      {"idle off",
+       {0, 120, 600},
+       false,
+       {"", "0"},
+       0,
+       {"/UserVars/TaviShellInteractiveTimeOut -i 0"},
+       {"Disabled shell interactive timeout"},
+       0},
   };
   for (const Case& c : cases) {
     SCOPED_TRACE(c.name);
@@ -130,9 +158,19 @@ TEST(TimeoutsScreenTest, ConsoleTimeoutComparesStoredSeconds) {
   unreadable["advancedOptions"].erase("/UserVars/TulkTimeOut");
   const Case cases[] = {
       {"unreadable shows 10 and keeps it", unreadable, "", "[ 10    ]", 0, {}, {}},
-      {"90 s is rewritten as one minute", HostWithTimeouts({0, 0, 90}), "", "[ 1     ]", 0,
-       {"/UserVars/TulkTimeOut -i 60"}, {"Modified Tulk timeout to 1 minutes"}},
-      {"off", HostWithTimeouts({0, 0, 600}), "0", "[ 10    ]", 0, {"/UserVars/TulkTimeOut -i 0"},
+      {"90 s is rewritten as one minute",
+       HostWithTimeouts({0, 0, 90}),
+       "",
+       "[ 1     ]",
+       0,
+       {"/UserVars/TulkTimeOut -i 60"},
+       {"Modified Tulk timeout to 1 minutes"}},
+      {"off",
+       HostWithTimeouts({0, 0, 600}),
+       "0",
+       "[ 10    ]",
+       0,
+       {"/UserVars/TulkTimeOut -i 0"},
        {"Disabled Tulk timeout"}},
       {"1441 refused", HostWithTimeouts({0, 0, 600}), "1441", "[ 10    ]", 1, {}, {}},
       {"empty", HostWithTimeouts({0, 0, 600}), "<BS>", "[ 10    ]", 0, {}, {}},

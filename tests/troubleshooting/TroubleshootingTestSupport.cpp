@@ -94,8 +94,7 @@ bool Greyed(const TestConsole& console, const std::string& label) {
   return ForegroundOf(console, label) == 6;
 }
 
-::testing::AssertionResult SelectTitle(TestConsole& console, const std::string& title,
-                                       int moves) {
+::testing::AssertionResult SelectTitle(TestConsole& console, const std::string& title, int moves) {
   for (int step = 0; step <= moves; ++step) {
     if (RightTitle(console) == title) {
       return ::testing::AssertionSuccess();
