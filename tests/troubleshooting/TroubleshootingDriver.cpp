@@ -1,14 +1,8 @@
-// Test-only program: the real console start-up and host services with a
-// home frame that opens one troubleshooting screen directly, as a
-// logged-in session would. The troubleshooting screen tests drive it in a
-// pseudo-terminal.
-//
-//   TULK_TROUBLESHOOTING_SCENE   window (default), shell-timeouts,
-//                                tulk-timeout, agents
-//   TULK_TROUBLESHOOTING_USER    the logged-in user (default "root")
-//
-// The home frame shows "result: N" after the scene (-1: the idle timeout
-// ended it); "o" opens it again.
+// Test-only program: the real start-up with a home frame that opens one
+// troubleshooting screen directly, as a logged-in "root" would.
+// TULK_TROUBLESHOOTING_SCENE: window (default), shell-timeouts,
+// tulk-timeout, agents. The home frame then shows "result: N" (-1: the
+// idle timeout ended it); "o" opens the scene again.
 
 #include <curses.h>
 
@@ -30,11 +24,6 @@ namespace {
 
 using namespace Tulk;
 
-std::string Env(const char* name, const char* fallback) {
-  const char* value = std::getenv(name);
-  return value != nullptr ? value : fallback;
-}
-
 template <typename Scene>
 int RunScene(Frame* owner) {
   Scene scene(owner);
@@ -43,48 +32,39 @@ int RunScene(Frame* owner) {
 
 class DriverHome : public Frame {
  public:
-  DriverHome() : Frame(nullptr, 0, 0, COLS, LINES, kBlack, kWhite) {
-    Box();
-    PutText(2, 1, "TROUBLESHOOTING DRIVER");
-  }
+  DriverHome() : Frame(nullptr, 0, 0, COLS, LINES, kBlack, kWhite) { Box(); }
 
   int Run() override {
-    Open();
-    for (;;) {
-      if (WaitForKey(this, false) == 'o') {
-        Open();
+    for (int key = 'o';; key = WaitForKey(this, false)) {
+      if (key == 'o') {
+        PutText(2, 3, "result: " + std::to_string(Open()) + "  ");
+        Redraw(true);
       }
     }
   }
 
  private:
-  void Open() {
-    const std::string scene = Env("TULK_TROUBLESHOOTING_SCENE", "window");
+  int Open() {
+    const char* value = std::getenv("TULK_TROUBLESHOOTING_SCENE");
+    const std::string scene = value != nullptr ? value : "window";
     SetLoggedIn(true);
-    int result = 0;
+    int result = -1;
     try {
-      if (scene == "shell-timeouts") {
-        result = RunScene<ShellTimeoutDialog>(this);
-      } else if (scene == "tulk-timeout") {
-        result = RunScene<TulkTimeoutDialog>(this);
-      } else if (scene == "agents") {
-        result = RunScene<RestartAgentsDialog>(this);
-      } else {
-        result = RunScene<TroubleShootingWindow>(this);
-      }
+      result = scene == "shell-timeouts" ? RunScene<ShellTimeoutDialog>(this)
+               : scene == "tulk-timeout" ? RunScene<TulkTimeoutDialog>(this)
+               : scene == "agents"       ? RunScene<RestartAgentsDialog>(this)
+                                         : RunScene<TroubleShootingWindow>(this);
     } catch (const TulkTimeout&) {
-      result = -1;
     }
     SetLoggedIn(false);
-    PutText(2, 3, "result: " + std::to_string(result) + "  ");
-    Redraw(true);
+    return result;
   }
 };
 
 }  // namespace
 
 int main(int argc, char** argv) {
-  currentUser = Env("TULK_TROUBLESHOOTING_USER", "root");
+  currentUser = "root";
   ConsoleHooks hooks;
   hooks.preferenceInit = InitPreferences;
   hooks.readIdleTimeout = ReadTulkTimeout;

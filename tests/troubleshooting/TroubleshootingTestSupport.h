@@ -1,15 +1,12 @@
 #pragma once
 // Helpers of the troubleshooting screen tests: the driver program
-// (TroubleshootingDriver.cpp) on a chosen host, and what the simulated host
-// recorded.
+// (TroubleshootingDriver.cpp) on a chosen host, the simulated host's
+// records and the screen's colours.
 
 #include <string>
 #include <vector>
 
-#include <nlohmann/json.hpp>
-
 #include "ScreenTestSupport.h"
-#include "TestConsole.h"
 
 namespace TroubleshootingTest {
 
@@ -18,47 +15,81 @@ using Lines = std::vector<std::string>;
 using TulkTest::Gone;
 using TulkTest::Settled;
 using TulkTest::TestConsole;
-using TulkTest::WaitUntil;
 
-/// Options that run the driver with `scene` ("window", "shell-timeouts",
-/// "tulk-timeout", "agents") on `host`.
-TulkTest::Options DriverOptions(const Json& host = TulkTest::DemoHostState(),
-                                const std::string& scene = "window");
+/// The driver opening `scene` ("window", "shell-timeouts", "tulk-timeout",
+/// "agents") on `host`.
+inline TulkTest::Options DriverOptions(const Json& host, const std::string& scene = "window") {
+  TulkTest::Options options;
+  options.program = TULK_TEST_TROUBLESHOOTING_DRIVER;
+  options.hostState = host.dump();
+  options.env["TULK_TROUBLESHOOTING_SCENE"] = scene;
+  return options;
+}
 
-/// The demo host with the shell and SSH running or not.
-Json HostWithServices(bool shellRunning, bool sshRunning);
+/// The demo host with the shell and SSH running (and enabled) or not.
+inline Json HostWithServices(bool shellRunning, bool sshRunning) {
+  Json host = TulkTest::DemoHostState();
+  host["services"]["TavShell"] = {{"running", shellRunning}, {"enabled", shellRunning}};
+  host["services"]["SSH"] = {{"running", sshRunning}, {"enabled", sshRunning}};
+  return host;
+}
 
-/// The host state file as it is now.
-Json HostState(const TestConsole& console);
+/// The tool runs whose argv, joined by blanks, starts with `prefix`.
+inline Lines ToolRuns(const TestConsole& console, const std::string& prefix = "") {
+  Lines runs;
+  for (const Json& record : TulkTest::SimRecords(console.Root(), "commands.jsonl")) {
+    std::string line;
+    for (const Json& word : record["argv"]) {
+      line += (line.empty() ? "" : " ") + word.get<std::string>();
+    }
+    if (line.rfind(prefix, 0) == 0) {
+      runs.push_back(line);
+    }
+  }
+  return runs;
+}
 
-/// The tool runs so far, each argv joined by blanks.
-Lines ToolRuns(const TestConsole& console);
+/// The system-log lines holding `text`, without their "<N>".
+inline Lines LogLinesWith(const TestConsole& console, const std::string& text) {
+  Lines lines;
+  for (const std::string& line : console.LogLines()) {
+    if (line.find(text) != std::string::npos) {
+      lines.push_back(line.substr(line.find('>') + 1));
+    }
+  }
+  return lines;
+}
 
-/// The tool runs whose line starts with `prefix`.
-Lines ToolRunsStarting(const TestConsole& console, const std::string& prefix);
+/// The foreground colour of the first cell of `text` (-2: not shown).
+inline int ForegroundOf(const TestConsole& console, const std::string& text) {
+  for (int row = 0; row < 25; ++row) {
+    std::string cells;  // one byte a cell: the box's lines take several
+    for (int col = 0; col < 80; ++col) {
+      const std::string cell = console.At(row, col).text;
+      cells += cell.size() == 1 ? cell : std::string("?");
+    }
+    if (const std::size_t col = cells.find(text); col != std::string::npos) {
+      return console.At(row, static_cast<int>(col)).fg;
+    }
+  }
+  return -2;
+}
 
-/// The system-log lines (without their "<N>") holding `text`.
-Lines LogLinesWith(const TestConsole& console, const std::string& text);
-
-/// The right pane's title (row 1, from the middle of the screen), trimmed.
-std::string RightTitle(const TestConsole& console, int cols = 80);
-
-/// The screen row (of 25) whose text holds `text`, or -1.
-int RowOf(const TestConsole& console, const std::string& text);
-
-/// The screen column (cells) where `text` starts on `row`, or -1.
-int ColumnOf(const TestConsole& console, int row, const std::string& text);
-
-/// The foreground colour of the first cell of `text` on the screen (-2
-/// when it is not shown).
-int ForegroundOf(const TestConsole& console, const std::string& text);
-
-/// Whether the menu label `label` is drawn greyed (dark grey).
-bool Greyed(const TestConsole& console, const std::string& label);
-
-/// Presses Down until the right title is `title`; fails after `moves`
-/// moves or when the selection stops moving.
-::testing::AssertionResult SelectTitle(TestConsole& console, const std::string& title,
-                                       int moves = 5);
+/// Presses Down until row 1 (the titles) shows `title`, at most `moves`
+/// times.
+inline ::testing::AssertionResult SelectTitle(TestConsole& console, const std::string& title,
+                                              int moves = 5) {
+  for (int step = 0; step < moves && console.Row(1).find(title) == std::string::npos; ++step) {
+    const std::string shown = console.Row(1);
+    console.Key("Down");
+    TulkTest::WaitUntil(
+        console, [&] { return console.Row(1) != shown; }, "a move");
+    console.WaitQuiet(std::chrono::milliseconds(60));  // a move may arrive in pieces
+  }
+  if (console.Row(1).find(title) == std::string::npos) {
+    return ::testing::AssertionFailure() << "no entry " << title << "\n" << console.Dump();
+  }
+  return ::testing::AssertionSuccess();
+}
 
 }  // namespace TroubleshootingTest
