@@ -22,7 +22,9 @@
 /// Validation: Accept() checks the values in its own stated order and, at
 /// the first failure, returns Reject(field, title, text): the message dialog
 /// (MessageDialog.h) is shown, the offending field becomes current with the
-/// cursor in it, and the form stays open.
+/// cursor in it, and the form stays open. A form that reports a refused
+/// value and closes all the same (the timeout dialogs) calls Notify() and
+/// returns true.
 ///
 /// The terminal cursor: by default shown while an input field is current and
 /// hidden on every other item; SetCursorAlways() keeps it shown on every

@@ -2,6 +2,7 @@
 
 #include <syslog.h>
 
+#include <iterator>
 #include <utility>
 #include <vector>
 
