@@ -19,6 +19,7 @@
 #include "toolkit/MessageDialog.h"
 #include "toolkit/RunFrame.h"
 #include "toolkit/TextArea.h"
+#include "troubleshooting/TroubleShootingWindow.h"
 
 namespace Tulk {
 namespace {
@@ -197,6 +198,9 @@ bool GeneralWindow::Open(std::uint32_t id) {
       return true;
     case kEntryKeyboard:
       RunDialog<KeyboardDialog>(this);
+      return true;
+    case kEntryTroubleshooting:
+      RunDialog<TroubleShootingWindow>(this);
       return true;
     default:
       return false;

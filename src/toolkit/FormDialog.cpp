@@ -157,11 +157,13 @@ bool FormDialog::Accept() {
   return true;
 }
 
+void FormDialog::Notify(std::uint32_t titleId, std::uint32_t textId) {
+  MessageDialog message(this, titleId, Text(textId));
+  RunFrame(&message);
+}
+
 bool FormDialog::Reject(const Item& field, std::uint32_t titleId, std::uint32_t textId) {
-  {
-    MessageDialog message(this, titleId, Text(textId));
-    RunFrame(&message);
-  }
+  Notify(titleId, textId);
   Focus(field);
   return false;
 }

@@ -22,7 +22,9 @@
 /// Validation: Accept() checks the values in its own stated order and, at
 /// the first failure, returns Reject(field, title, text): the message dialog
 /// (MessageDialog.h) is shown, the offending field becomes current with the
-/// cursor in it, and the form stays open.
+/// cursor in it, and the form stays open. A form that reports a refused
+/// value and closes all the same (the timeout dialogs) calls Notify() and
+/// returns true.
 ///
 /// The terminal cursor: by default shown while an input field is current and
 /// hidden on every other item; SetCursorAlways() keeps it shown on every
@@ -132,6 +134,11 @@ class FormDialog : public Dialog {
   /// What Run() returns when Accept() closes the form (1 unless set): a
   /// form that closes after reporting a host failure may return 0.
   void SetAcceptResult(int result) { acceptResult_ = result; }
+  /// Shows the message dialog titled with catalogue text `titleId` with text
+  /// `textId` and waits until it is closed; the form's current item stays.
+  /// For forms that report a refused value and still go on (Accept() then
+  /// returns true).
+  void Notify(std::uint32_t titleId, std::uint32_t textId);
 
  private:
   void Move(bool down);
