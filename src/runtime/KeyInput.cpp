@@ -12,6 +12,7 @@
 #include "include/Constants.h"
 #include "include/ProcessFlags.h"
 #include "runtime/Clock.h"
+#include "runtime/ReadySignal.h"
 #include "runtime/RuntimeFrame.h"
 #include "runtime/SignalThread.h"
 #include "runtime/SystemLog.h"
@@ -62,7 +63,10 @@ int PollInput(const timeval* limit) {
   }
   pollfd fds[2] = {{0, POLLIN, 0}, {SignalPipeReadFd(), POLLIN, 0}};
   int millis = limit == nullptr ? -1 : Clock::RealMilliseconds(limit->tv_sec, limit->tv_usec);
-  int ready = poll(fds, 2, millis);
+  int ready = millis != 0 ? AnnounceReady(fds, 2) : 0;
+  if (ready == 0) {
+    ready = poll(fds, 2, millis);
+  }
   if (ready < 0) {
     LogErrno("poll() failed");
     return kPollOther;

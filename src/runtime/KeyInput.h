@@ -32,7 +32,8 @@ inline constexpr long kDimSeconds = 60;
 
 /// Waits for a key on standard input or a byte on the signal pipe, at most
 /// for `limit` (null: without limit). Returns the curses key code, or one
-/// of the kPoll* values.
+/// of the kPoll* values. Before a wait that can block, a test harness is
+/// told that the console is ready (ReadySignal.h).
 int PollInput(const timeval* limit);
 
 /// Returns the next key for `frame`. With `idleTimeout` true and a

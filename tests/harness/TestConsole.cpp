@@ -16,6 +16,7 @@
 #include <stdexcept>
 
 #include "KeyNames.h"
+#include "ProcessHygiene.h"
 
 extern char** environ;
 
@@ -88,10 +89,7 @@ TestConsole::TestConsole(Options options) : options_(std::move(options)) {
 }
 
 TestConsole::~TestConsole() {
-  if (Running()) {
-    kill(pid_, SIGKILL);
-    Reap(true);
-  }
+  Stop();
   if (master_ >= 0) {
     close(master_);
   }
@@ -110,13 +108,15 @@ std::vector<std::string> TestConsole::BuildEnvironment() const {
       env[text.substr(0, equals)] = text.substr(equals + 1);
     }
   }
-  for (const char* name : {"TULK_ROOT", "TULK_HOST_STATE", "TULK_LOG_FILE", "TULK_TIME_SCALE",
-                           "SSH_CLIENT", "TERMINFO", "TULK_SIM_DEMO_FILE", "LESSSECURE"}) {
+  for (const char* name :
+       {"TULK_ROOT", "TULK_HOST_STATE", "TULK_LOG_FILE", "TULK_TIME_SCALE", "SSH_CLIENT",
+        "TERMINFO", "TULK_SIM_DEMO_FILE", "LESSSECURE", "ESCDELAY"}) {
     env.erase(name);
   }
   env["TULK_ROOT"] = root_.string();
   env["TULK_LOG_FILE"] = logPath_.string();
   env["TMPDIR"] = folder_.string();
+  env["TULK_READY_FD"] = std::to_string(ReadyChannel::kChildFd);
   if (options_.term.empty()) {
     env.erase("TERM");
   } else {
@@ -197,12 +197,14 @@ void TestConsole::Start() {
   winsize size{};
   size.ws_row = static_cast<unsigned short>(options_.rows);
   size.ws_col = static_cast<unsigned short>(options_.cols);
+  NoteSent();
   pid_ = forkpty(&master_, nullptr, nullptr, &size);
   if (pid_ < 0) {
     throw std::runtime_error("forkpty failed: " + std::string(std::strerror(errno)));
   }
   if (pid_ == 0) {
-    close_range(3, ~0U, 0);
+    ready_.PassToChild();
+    close_range(ReadyChannel::kChildFd + 1, ~0U, 0);
     sigset_t none;
     sigemptyset(&none);
     sigprocmask(SIG_SETMASK, &none, nullptr);
@@ -220,15 +222,49 @@ void TestConsole::Start() {
     execve(args[0], args.data(), envp.data());
     _exit(127);
   }
+  ready_.CloseWriteEnd();
   fcntl(master_, F_SETFL, fcntl(master_, F_GETFL) | O_NONBLOCK);
   fcntl(master_, F_SETFD, FD_CLOEXEC);
 }
 
-void TestConsole::Key(std::string_view name, int times) {
-  std::string bytes = KeyBytes(name);
-  for (int i = 0; i < times; ++i) {
-    Send(bytes);
+void TestConsole::Stop() {
+  if (pid_ <= 0 || reaped_) {
+    return;
   }
+  if (!exitStatus_) {
+    // A terminating signal ends the console through exit(): pam_wrapper
+    // removes its folder then, and the sanitizers run their exit checks.
+    kill(pid_, SIGTERM);
+    const auto deadline = std::chrono::steady_clock::now() + 5s;
+    while (!exitStatus_ && std::chrono::steady_clock::now() < deadline) {
+      Pump(10ms);
+      CheckExit(false);
+    }
+    if (!exitStatus_) {
+      kill(pid_, SIGKILL);
+      CheckExit(true);
+    }
+  }
+  std::vector<pid_t> ended = SignalSession(pid_, SIGKILL);
+  ended.push_back(pid_);
+  if (!options_.pamUsers.empty()) {
+    RemovePamFolders(folder_.string() + "/", ended);
+  }
+  while (waitpid(pid_, nullptr, 0) < 0 && errno == EINTR) {
+  }
+  reaped_ = true;
+}
+
+void TestConsole::NoteSent() {
+  lastSent_ = ReadyChannel::Now();
+}
+
+void TestConsole::Key(std::string_view name, int times) {
+  std::string bytes;
+  for (int i = 0; i < times; ++i) {
+    bytes += KeyBytes(name);
+  }
+  Send(bytes);
 }
 
 void TestConsole::Type(std::string_view text) {
@@ -236,6 +272,28 @@ void TestConsole::Type(std::string_view text) {
 }
 
 void TestConsole::Send(std::string_view bytes) {
+  AwaitTurn();
+  Write(bytes);
+}
+
+void TestConsole::SendNow(std::string_view bytes) {
+  Write(bytes);
+}
+
+void TestConsole::AwaitTurn() {
+  if (!Running()) {
+    return;
+  }
+  ready_.Read();
+  // Only while the program itself holds the terminal: a pager in front of
+  // it reads the keys, and the program reports nothing until it is back.
+  if (ready_.Newest() <= lastSent_ && tcgetpgrp(master_) == pid_) {
+    (void)WaitReady();
+  }
+}
+
+void TestConsole::Write(std::string_view bytes) {
+  NoteSent();
   while (!bytes.empty()) {
     ssize_t written = write(master_, bytes.data(), bytes.size());
     if (written < 0) {
@@ -250,7 +308,9 @@ void TestConsole::Send(std::string_view bytes) {
 }
 
 void TestConsole::Signal(int signal) {
+  AwaitTurn();
   if (Running()) {
+    NoteSent();
     kill(pid_, signal);
   }
 }
@@ -259,6 +319,8 @@ void TestConsole::Resize(int cols, int rows) {
   winsize size{};
   size.ws_row = static_cast<unsigned short>(rows);
   size.ws_col = static_cast<unsigned short>(cols);
+  AwaitTurn();
+  NoteSent();
   ioctl(master_, TIOCSWINSZ, &size);
   terminal_->Resize(rows, cols);
 }
@@ -270,31 +332,89 @@ void TestConsole::Pump(Millis timeout) {
   auto deadline = Clock::now() + timeout;
   for (;;) {
     auto left = std::chrono::duration_cast<Millis>(deadline - Clock::now());
-    pollfd fd{master_, POLLIN, 0};
-    int ready = poll(&fd, 1, static_cast<int>(std::max<long>(left.count(), 0)));
+    pollfd fds[2] = {{master_, POLLIN, 0}, {ready_.ReadEnd(), POLLIN, 0}};
+    int ready = poll(fds, 2, static_cast<int>(std::max<long>(left.count(), 0)));
     if (ready <= 0) {
       return;
     }
-    char buffer[8192];
-    ssize_t got = read(master_, buffer, sizeof buffer);
-    if (got <= 0) {
-      if (got < 0 && (errno == EAGAIN || errno == EINTR)) {
-        continue;
+    if ((fds[1].revents & POLLIN) != 0) {
+      ready_.Read();
+    }
+    if ((fds[0].revents & (POLLIN | POLLHUP | POLLERR)) != 0) {
+      char buffer[8192];
+      ssize_t got = read(master_, buffer, sizeof buffer);
+      if (got < 0 && errno != EAGAIN && errno != EINTR) {
+        return;  // EIO: the program closed the terminal
       }
-      return;  // EIO: the program closed the terminal
-    }
-    bytesReceived_ += static_cast<std::size_t>(got);
-    if (options_.keepOutput) {
-      output_.append(buffer, static_cast<std::size_t>(got));
-    }
-    terminal_->Write(std::string_view(buffer, static_cast<std::size_t>(got)));
-    std::string replies = terminal_->TakeReplies();
-    if (!replies.empty()) {
-      Send(replies);
+      if (got > 0) {
+        Absorb(buffer, static_cast<std::size_t>(got));
+      } else if (got == 0 || (fds[0].revents & POLLIN) == 0) {
+        return;
+      }
     }
     // Keep reading what is already there, without waiting any longer.
     deadline = std::min(deadline, Clock::now());
   }
+}
+
+void TestConsole::DrainOutput() {
+  // read() on the pseudo-terminal, unlike poll(), first waits for the
+  // kernel to pass on what the program has written: all output sent before
+  // a readiness report is read here.
+  char buffer[8192];
+  for (;;) {
+    ssize_t got = read(master_, buffer, sizeof buffer);
+    if (got < 0 && errno == EINTR) {
+      continue;
+    }
+    if (got <= 0) {
+      return;
+    }
+    Absorb(buffer, static_cast<std::size_t>(got));
+  }
+}
+
+void TestConsole::Absorb(const char* bytes, std::size_t count) {
+  bytesReceived_ += count;
+  if (options_.keepOutput) {
+    output_.append(bytes, count);
+  }
+  terminal_->Write(std::string_view(bytes, count));
+  std::string replies = terminal_->TakeReplies();
+  if (!replies.empty()) {
+    Write(replies);  // the program may be waiting for them: no turn to await
+  }
+}
+
+::testing::AssertionResult TestConsole::WaitReady(Millis timeout) {
+  auto deadline = Clock::now() + timeout;
+  for (;;) {
+    ready_.Read();
+    if (ready_.Newest() > lastSent_) {
+      DrainOutput();
+      if (ready_.Newest() > lastSent_) {  // unless draining sent a reply
+        return ::testing::AssertionSuccess();
+      }
+      continue;
+    }
+    CheckExit(false);
+    if (exitStatus_) {
+      Pump(0ms);
+      return ::testing::AssertionFailure()
+             << "the program ended (status " << *exitStatus_ << ") instead of waiting for a key\n"
+             << Dump();
+    }
+    if (Clock::now() >= deadline) {
+      return ::testing::AssertionFailure()
+             << "the program did not wait for a key within " << timeout.count() << " ms\n"
+             << Dump();
+    }
+    Pump(20ms);
+  }
+}
+
+std::chrono::steady_clock::time_point TestConsole::ReadyAt() const {
+  return std::chrono::steady_clock::time_point(std::chrono::nanoseconds(ready_.Newest()));
 }
 
 ::testing::AssertionResult TestConsole::WaitForText(std::string_view text, Millis timeout) {
@@ -329,6 +449,21 @@ void TestConsole::Pump(Millis timeout) {
   }
 }
 
+::testing::AssertionResult TestConsole::WaitUntil(const std::function<bool()>& condition,
+                                                  std::string_view what, Millis timeout) {
+  auto deadline = Clock::now() + timeout;
+  for (;;) {
+    Pump(0ms);
+    if (condition()) {
+      return ::testing::AssertionSuccess();
+    }
+    if (Clock::now() >= deadline) {
+      return ::testing::AssertionFailure() << "timed out waiting for " << what << "\n" << Dump();
+    }
+    Pump(20ms);
+  }
+}
+
 ::testing::AssertionResult TestConsole::WaitForLog(std::string_view text, Millis timeout) {
   auto deadline = Clock::now() + timeout;
   for (;;) {
@@ -350,28 +485,17 @@ void TestConsole::Pump(Millis timeout) {
   }
 }
 
-void TestConsole::WaitQuiet(Millis quiet, Millis timeout) {
-  auto deadline = Clock::now() + timeout;
-  while (Clock::now() < deadline) {
-    std::size_t before = bytesReceived_;
-    Pump(quiet);
-    if (bytesReceived_ == before) {
-      return;
-    }
-  }
-}
-
-void TestConsole::Reap(bool block) {
-  if (pid_ <= 0 || exitStatus_) {
+void TestConsole::CheckExit(bool block) {
+  if (pid_ <= 0 || exitStatus_ || reaped_) {
     return;
   }
-  int status = 0;
-  pid_t done;
+  siginfo_t info{};
+  int done;
   do {
-    done = waitpid(pid_, &status, block ? 0 : WNOHANG);
+    done = waitid(P_PID, static_cast<id_t>(pid_), &info, WEXITED | WNOWAIT | (block ? 0 : WNOHANG));
   } while (done < 0 && errno == EINTR);
-  if (done == pid_) {
-    exitStatus_ = WIFEXITED(status) ? WEXITSTATUS(status) : 128 + WTERMSIG(status);
+  if (done == 0 && info.si_pid == pid_) {
+    exitStatus_ = info.si_code == CLD_EXITED ? info.si_status : 128 + info.si_status;
   }
 }
 
@@ -379,9 +503,9 @@ std::optional<int> TestConsole::WaitExit(Millis timeout) {
   auto deadline = Clock::now() + timeout;
   for (;;) {
     Pump(0ms);
-    Reap(false);
+    CheckExit(false);
     if (exitStatus_) {
-      Pump(0ms);
+      DrainOutput();
       return exitStatus_;
     }
     if (Clock::now() >= deadline) {

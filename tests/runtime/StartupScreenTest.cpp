@@ -109,8 +109,8 @@ TEST(Startup, TerminalWithoutColourChangeDrawsInStandout) {
   Options options;
   options.term = "vt102";
   TestConsole console(options);
-  ASSERT_TRUE(console.WaitForText(kWelcomeText));
-  console.WaitQuiet();
+  ASSERT_TRUE(console.WaitReady());
+  ASSERT_TRUE(console.Contains(kWelcomeText)) << console.Dump();
   TulkTest::Cell cell = console.At(0, 0);
   EXPECT_EQ(cell.text, "┌");
   EXPECT_TRUE(cell.reverse) << console.Dump();
@@ -118,8 +118,8 @@ TEST(Startup, TerminalWithoutColourChangeDrawsInStandout) {
 
 TEST(Startup, ColourTerminalDrawsWhiteOnBlack) {
   TestConsole console;
-  ASSERT_TRUE(console.WaitForText(kWelcomeText));
-  console.WaitQuiet();
+  ASSERT_TRUE(console.WaitReady());
+  ASSERT_TRUE(console.Contains(kWelcomeText)) << console.Dump();
   TulkTest::Cell cell = console.At(0, 0);
   EXPECT_EQ(cell.fg, Tulk::kWhite);
   EXPECT_EQ(cell.bg, Tulk::kBlack);
@@ -130,8 +130,8 @@ TEST(Startup, UnsetTermFallsBackToVt102) {
   Options options;
   options.term = "";
   TestConsole console(options);
-  ASSERT_TRUE(console.WaitForText(kWelcomeText));
-  console.WaitQuiet();
+  ASSERT_TRUE(console.WaitReady());
+  ASSERT_TRUE(console.Contains(kWelcomeText)) << console.Dump();
   EXPECT_TRUE(console.At(1, 2).reverse) << "vt102 cannot change colours: standout expected";
 }
 
