@@ -40,7 +40,7 @@ ManagementNetworkView ReadManagementNetworkView() {
 
 std::string FormatManagementNetworkView(const ManagementNetworkView& view, StringFactory& strings,
                                         int width) {
-  const std::string description = strings.GetString(25);
+  std::string description = strings.GetString(25);
   if (!view.found) {
     return description;
   }

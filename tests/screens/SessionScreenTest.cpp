@@ -3,6 +3,7 @@
 
 #include <signal.h>
 
+#include "ProcessHygiene.h"
 #include "SessionTestSupport.h"
 
 namespace {
@@ -74,6 +75,26 @@ TEST(SessionScreenTest, Sigusr2DuringASessionExitsAfterLogout) {
   EXPECT_EQ(console.WaitExit(), 0);
   EXPECT_EQ(CountLog(console, "<14>User root logged out"), 1);
   EXPECT_EQ(RecordsWhere(console, "audit.jsonl", "event", "tulk.logout").size(), 1u);
+}
+
+}  // namespace
+
+namespace {
+
+TEST(SessionScreenTest, KilledConsoleLeavesNoPamFolderBehind) {
+  std::string marker;
+  {
+    TestConsole console(ConsoleOptions());
+    ASSERT_TRUE(LogIn(console));
+    ASSERT_TRUE(Settled(console, "System Customization"));
+    marker = console.Root().parent_path().string() + "/";
+    ASSERT_EQ(TulkTest::PamFoldersOf(marker).size(), 1u);
+    console.Signal(SIGKILL);
+    ASSERT_EQ(console.WaitExit(), 128 + SIGKILL);
+    // Killed, pam_wrapper could not remove its folder itself.
+    EXPECT_EQ(TulkTest::PamFoldersOf(marker).size(), 1u);
+  }
+  EXPECT_TRUE(TulkTest::PamFoldersOf(marker).empty());
 }
 
 }  // namespace

@@ -44,24 +44,15 @@ std::string Cells(const TestConsole& console, int row, int col, int count) {
                                        << console.Dump();
 }
 
-TEST(ToolkitScreen, LowDialogIsCentredWithTitleHeaderAndBody) {
+// Where a dialog's parts sit and their colours: WindowTest, on curses' own
+// screen. Here: the terminal shows them, and the key loop runs the dialog.
+TEST(ToolkitScreen, LowDialogShowsItsPartsAndEscCancels) {
   TestConsole console(Scene("dialog"));
-  ASSERT_TRUE(console.WaitForText("Demo Dialog"));
   ASSERT_TRUE(console.WaitReady());
-  // 60 x 9 with a header of 6 on 80 x 25: column 10, row 8.
-  EXPECT_EQ(console.At(8, 10).text, "\u250c");
-  EXPECT_EQ(console.At(16, 69).text, "\u2518");
-  EXPECT_TRUE(HasColors(console, 8, 10, kBlack, kWhite));
   EXPECT_EQ(Cells(console, 9, 13, 11), "Demo Dialog");
-  EXPECT_TRUE(HasColors(console, 9, 13, kDarkGrey, kWhite));
   EXPECT_EQ(Cells(console, 11, 13, 23), "Header text of the demo");
-  EXPECT_TRUE(HasColors(console, 11, 13, kDarkGrey, kLightGrey));
-  // The body is rows 14 to 16: the footer on its middle row, no client area.
-  EXPECT_TRUE(HasColors(console, 13, 40, kDarkGrey, kWhite));
-  EXPECT_TRUE(HasColors(console, 14, 40, kYellow, kWhite));
   EXPECT_EQ(Cells(console, 15, 44, 25), "<Enter> OK  <Esc> Cancel ");
-  EXPECT_TRUE(HasColors(console, 15, 44, kYellow, kBlack));
-  EXPECT_TRUE(HasColors(console, 15, 52, kYellow, kDarkGrey));
+  EXPECT_TRUE(HasColors(console, 11, 13, kDarkGrey, kLightGrey));  // header text
   console.Key("Esc");
   EXPECT_TRUE(console.WaitForText("result: 0"));
 }
@@ -155,20 +146,14 @@ TEST(ToolkitScreen, RootWindowShowsPanesTitlesFootersAndTheVersionLine) {
   TestConsole console(Scene("menu"));
   ASSERT_TRUE(console.WaitReady());
   ASSERT_TRUE(console.WaitForLog("COLS=80, LINES=25"));
-  EXPECT_TRUE(HasColors(console, 0, 0, kLightGrey, kWhite));   // main area box
-  EXPECT_EQ(console.At(2, 1).text, "\u2500");                  // the line on row 2
-  EXPECT_TRUE(HasColors(console, 10, 5, kYellow, kWhite));     // left pane
-  EXPECT_TRUE(HasColors(console, 10, 41, kDarkGrey, kWhite));  // right pane
-  EXPECT_TRUE(HasColors(console, 1, 3, kYellow, kBlack));      // left title
+  // The frame, the left title and footer: WindowTest. Here what the menu
+  // puts in them.
   EXPECT_EQ(Cells(console, 1, 42, 18), "Configure Password");
   EXPECT_TRUE(HasColors(console, 1, 42, kDarkGrey, kWhite));      // right title
   EXPECT_TRUE(HasColors(console, 6, 42, kDarkGrey, kLightGrey));  // description
   EXPECT_TRUE(HasColors(console, 4, 42, kDarkGrey, kWhite));      // its white word
-  // Footers: left "<Up/Down>" black and "Select" dark grey; right "<Esc>" white.
   EXPECT_EQ(Cells(console, 22, 2, 16), "<Up/Down> Select");
-  EXPECT_TRUE(HasColors(console, 22, 2, kYellow, kBlack));
-  EXPECT_TRUE(HasColors(console, 22, 12, kYellow, kDarkGrey));
-  EXPECT_TRUE(HasColors(console, 22, 41, kDarkGrey, kWhite));
+  EXPECT_TRUE(HasColors(console, 22, 41, kDarkGrey, kWhite));  // right footer's "<Esc>"
   // The version line is centred on the status line.
   const std::string version = "Demo Hypervisor 8.0.1 (HyKernel 8.0.1 Build 1234)";
   EXPECT_EQ(Cells(console, 24, 40 - static_cast<int>(version.size()) / 2,
