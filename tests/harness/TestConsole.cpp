@@ -11,46 +11,16 @@
 #include <cerrno>
 #include <cstring>
 #include <fstream>
-#include <set>
 #include <sstream>
 #include <stdexcept>
 
 #include "KeyNames.h"
 #include "ProcessHygiene.h"
 
-extern char** environ;
-
 namespace TulkTest {
 namespace {
 
 using Clock = std::chrono::steady_clock;
-
-std::filesystem::path MakeFolder() {
-  std::string pattern = (std::filesystem::temp_directory_path() / "tulk-test-XXXXXX").string();
-  if (mkdtemp(pattern.data()) == nullptr) {
-    throw std::runtime_error("mkdtemp failed: " + std::string(std::strerror(errno)));
-  }
-  return pattern;
-}
-
-void RunToCompletion(const std::vector<std::string>& argv) {
-  pid_t pid = fork();
-  if (pid == 0) {
-    std::vector<char*> args;
-    for (const std::string& arg : argv) {
-      args.push_back(const_cast<char*>(arg.c_str()));
-    }
-    args.push_back(nullptr);
-    execv(args[0], args.data());
-    _exit(127);
-  }
-  int status = 0;
-  while (pid > 0 && waitpid(pid, &status, 0) < 0 && errno == EINTR) {
-  }
-  if (pid < 0 || !WIFEXITED(status) || WEXITSTATUS(status) != 0) {
-    throw std::runtime_error("failed to run " + argv[0]);
-  }
-}
 
 }  // namespace
 
@@ -62,26 +32,8 @@ std::string HostToolBinary() {
   return TULK_TEST_HOSTTOOL_BINARY;
 }
 
-TestConsole::TestConsole(Options options) : options_(std::move(options)) {
-  folder_ = MakeFolder();
-  root_ = folder_ / "root";
-  logPath_ = folder_ / "syslog.txt";
-  for (const char* sub : {"var/run", "var/log", "etc", "tmp"}) {
-    std::filesystem::create_directories(root_ / sub);
-  }
-  std::string tool = HostToolBinary();
-  if (options_.hostTools && !tool.empty() && std::filesystem::exists(tool)) {
-    RunToCompletion({tool, "--install", root_.string()});
-  }
-  if (options_.hostState) {
-    std::ofstream(HostStatePath()) << *options_.hostState;
-  }
-  if (!options_.pamUsers.empty()) {
-    WritePamServices();
-  }
-  if (options_.prepareRoot) {
-    options_.prepareRoot(root_);
-  }
+TestConsole::TestConsole(Options options)
+    : options_(std::move(options)), folder_(options_, HostToolBinary()) {
   terminal_ = std::make_unique<VirtualTerminal>(options_.rows, options_.cols);
   if (options_.start) {
     Start();
@@ -93,106 +45,14 @@ TestConsole::~TestConsole() {
   if (master_ >= 0) {
     close(master_);
   }
-  if (std::getenv("TULK_KEEP_TEST_ROOT") == nullptr) {
-    std::error_code ignored;
-    std::filesystem::remove_all(folder_, ignored);
-  }
-}
-
-std::vector<std::string> TestConsole::BuildEnvironment() const {
-  std::map<std::string, std::string> env;
-  for (char** entry = environ; *entry != nullptr; ++entry) {
-    std::string text = *entry;
-    auto equals = text.find('=');
-    if (equals != std::string::npos) {
-      env[text.substr(0, equals)] = text.substr(equals + 1);
-    }
-  }
-  for (const char* name :
-       {"TULK_ROOT", "TULK_HOST_STATE", "TULK_LOG_FILE", "TULK_TIME_SCALE", "SSH_CLIENT",
-        "TERMINFO", "TULK_SIM_DEMO_FILE", "LESSSECURE", "ESCDELAY"}) {
-    env.erase(name);
-  }
-  env["TULK_ROOT"] = root_.string();
-  env["TULK_LOG_FILE"] = logPath_.string();
-  env["TMPDIR"] = folder_.string();
-  env["TULK_READY_FD"] = std::to_string(ReadyChannel::kChildFd);
-  if (options_.term.empty()) {
-    env.erase("TERM");
-  } else {
-    env["TERM"] = options_.term;
-  }
-  if (options_.hostState) {
-    env["TULK_HOST_STATE"] = HostStatePath().string();
-  }
-  if (options_.timeScale > 0) {
-    std::ostringstream scale;
-    scale << options_.timeScale;
-    env["TULK_TIME_SCALE"] = scale.str();
-  }
-  if (!options_.pamUsers.empty()) {
-    env["LD_PRELOAD"] = TULK_TEST_PAM_WRAPPER_LIBRARY;
-    env["PAM_WRAPPER"] = "1";
-    env["PAM_WRAPPER_SERVICE_DIR"] = (folder_ / "pam").string();
-#ifdef TULK_TEST_SANITIZED
-    // The sanitizer runtime cannot come first when a library is preloaded.
-    // pam_wrapper loads libpam with RTLD_DEEPBIND, which the sanitizer
-    // runtime refuses; this release reads the switch under the name of its
-    // sibling wrapper, so both names are set.
-    env["PAM_WRAPPER_DISABLE_DEEPBIND"] = "1";
-    env["UID_WRAPPER_DISABLE_DEEPBIND"] = "1";
-    std::string asan = env.count("ASAN_OPTIONS") != 0 ? env["ASAN_OPTIONS"] + ":" : "";
-    env["ASAN_OPTIONS"] = asan + "verify_asan_link_order=0";
-#endif
-  }
-  for (const auto& [name, value] : options_.env) {
-    env[name] = value;
-  }
-  for (const std::string& name : options_.unsetEnv) {
-    env.erase(name);
-  }
-  std::vector<std::string> result;
-  for (const auto& [name, value] : env) {
-    result.push_back(name + "=" + value);
-  }
-  return result;
-}
-
-void TestConsole::WritePamServices() {
-  std::filesystem::path services = folder_ / "pam";
-  std::filesystem::create_directories(services);
-  {
-    std::ofstream passdb(services / "passdb");
-    for (const auto& [user, password] : options_.pamUsers) {
-      passdb << user << ":" << password << ":tulk\n";
-    }
-  }
-  {
-    std::ofstream policy(services / "policy");
-    for (const std::string& line : options_.pamPolicy) {
-      policy << line << "\n";
-    }
-  }
-  const std::string matrix =
-      std::string(TULK_TEST_PAM_MATRIX_MODULE) + " passdb=" + (services / "passdb").string();
-  const std::string policy =
-      std::string(TULK_TEST_PAM_POLICY_MODULE) + " policy=" + (services / "policy").string();
-  for (const char* service : {"tulk", "other"}) {
-    std::ofstream file(services / service);
-    file << "auth     required  " << matrix << "\n"
-         << "account  requisite " << policy << "\n"
-         << "account  required  " << matrix << "\n"
-         << "password requisite " << policy << "\n"
-         << "password required  " << matrix << "\n"
-         << "session  required  " << matrix << "\n";
-  }
 }
 
 void TestConsole::Start() {
   std::string program = options_.program.empty() ? TulkBinary() : options_.program;
   std::vector<std::string> argv{program};
   argv.insert(argv.end(), options_.args.begin(), options_.args.end());
-  std::vector<std::string> env = BuildEnvironment();
+  std::vector<std::string> env =
+      folder_.Environment(options_, {{"TULK_READY_FD", std::to_string(ReadyChannel::kChildFd)}});
 
   winsize size{};
   size.ws_row = static_cast<unsigned short>(options_.rows);
@@ -218,7 +78,7 @@ void TestConsole::Start() {
       envp.push_back(const_cast<char*>(entry.c_str()));
     }
     envp.push_back(nullptr);
-    chdir(folder_.c_str());
+    chdir(folder_.Path().c_str());
     execve(args[0], args.data(), envp.data());
     _exit(127);
   }
@@ -248,7 +108,7 @@ void TestConsole::Stop() {
   std::vector<pid_t> ended = SignalSession(pid_, SIGKILL);
   ended.push_back(pid_);
   if (!options_.pamUsers.empty()) {
-    RemovePamFolders(folder_.string() + "/", ended);
+    RemovePamFolders(folder_.Path().string() + "/", ended);
   }
   while (waitpid(pid_, nullptr, 0) < 0 && errno == EINTR) {
   }
@@ -288,11 +148,18 @@ void TestConsole::AwaitTurn() {
   // Only while the program itself holds the terminal: a pager in front of
   // it reads the keys, and the program reports nothing until it is back.
   if (ready_.Newest() <= lastSent_ && tcgetpgrp(master_) == pid_) {
-    (void)WaitReady();
+    auto ready = WaitReady();
+    if (!ready && Running()) {
+      ADD_FAILURE() << "input waited for its turn in vain (SendNow() sends at once): "
+                    << ready.message();
+    }
   }
 }
 
 void TestConsole::Write(std::string_view bytes) {
+  if (bytes.empty()) {
+    return;  // no input: nothing the program could report about
+  }
   NoteSent();
   while (!bytes.empty()) {
     ssize_t written = write(master_, bytes.data(), bytes.size());
@@ -569,7 +436,7 @@ std::string TestConsole::Dump() const {
 
 std::vector<std::string> TestConsole::LogLines() const {
   std::vector<std::string> lines;
-  std::ifstream in(logPath_);
+  std::ifstream in(folder_.LogPath());
   std::string line;
   while (std::getline(in, line)) {
     lines.push_back(line);

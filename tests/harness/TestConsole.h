@@ -39,14 +39,15 @@
 #include <cstdint>
 #include <filesystem>
 #include <functional>
-#include <map>
 #include <memory>
 #include <optional>
 #include <string>
 #include <string_view>
 #include <vector>
 
+#include "Options.h"
 #include "ReadyChannel.h"
+#include "TestFolder.h"
 #include "VirtualTerminal.h"
 
 namespace TulkTest {
@@ -57,41 +58,6 @@ using Millis = std::chrono::milliseconds;
 /// How long a wait lasts before it fails: long enough for a sanitizer build
 /// on a machine busy with other tests; a passing wait ends much sooner.
 inline constexpr Millis kWait = 15s;
-
-struct Options {
-  int cols = 80;
-  int rows = 25;
-  /// TERM for the program; empty leaves TERM unset.
-  std::string term = "xterm-256color";
-  /// Arguments after the program name.
-  std::vector<std::string> args;
-  /// Extra environment; these win over the harness's own settings.
-  std::map<std::string, std::string> env;
-  /// Variables removed from the environment.
-  std::vector<std::string> unsetEnv;
-  /// The program; empty means the tulk binary of this build.
-  std::string program;
-  /// JSON text of the simulated host's state, written into the test folder
-  /// and named by TULK_HOST_STATE. Unset: the built-in demo host.
-  std::optional<std::string> hostState;
-  /// TULK_TIME_SCALE for the program; 0 leaves it unset.
-  double timeScale = 0;
-  /// Install the simulated host tools into the root.
-  bool hostTools = true;
-  /// Called with the root before the program starts (to add files).
-  std::function<void(const std::filesystem::path& root)> prepareRoot;
-  /// Start the program in the constructor.
-  bool start = true;
-  /// Keep every byte the program writes (Output()).
-  bool keepOutput = false;
-  /// Console logins through the real PAM library: pam_wrapper preloaded,
-  /// a "tulk" service of pam_matrix with these users (name → password), and
-  /// the test policy module before it. Empty: no PAM set-up.
-  std::map<std::string, std::string> pamUsers;
-  /// Lines "user:outcome" for the test policy module: "expired",
-  /// "denied", "chauthtok-fails".
-  std::vector<std::string> pamPolicy;
-};
 
 class TestConsole {
  public:
@@ -161,11 +127,11 @@ class TestConsole {
   /// The copy of the system log, one "<N>message" line each.
   std::vector<std::string> LogLines() const;
   /// The host root of this test.
-  const std::filesystem::path& Root() const { return root_; }
+  std::filesystem::path Root() const { return folder_.Root(); }
   /// The pam_matrix password file (passwords changed through PAM land here).
-  std::filesystem::path PamPasswordFile() const { return folder_ / "pam" / "passdb"; }
+  std::filesystem::path PamPasswordFile() const { return folder_.PamPasswordFile(); }
   /// The host state file (the demo host's private copy when none was given).
-  std::filesystem::path HostStatePath() const { return folder_ / "host-state.json"; }
+  std::filesystem::path HostStatePath() const { return folder_.HostStatePath(); }
   /// Every byte the program wrote to the terminal so far.
   std::size_t BytesReceived() const { return bytesReceived_; }
   /// The raw bytes the program wrote (kept when options.keepOutput).
@@ -190,13 +156,9 @@ class TestConsole {
   // Writes to the terminal as is, noting the time first.
   void Write(std::string_view bytes);
   void NoteSent();
-  void WritePamServices();
-  std::vector<std::string> BuildEnvironment() const;
 
   Options options_;
-  std::filesystem::path folder_;
-  std::filesystem::path root_;
-  std::filesystem::path logPath_;
+  TestFolder folder_;
   std::unique_ptr<VirtualTerminal> terminal_;
   ReadyChannel ready_;
   // When the last key, signal or resize went to the program (monotonic ns),
