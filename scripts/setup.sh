@@ -8,7 +8,7 @@ PACKAGES=(
   g++ cmake make pkg-config
   libncurses-dev ncurses-base libpam0g-dev libboost-filesystem-dev libboost-system-dev
   nlohmann-json3-dev libgtest-dev libgmock-dev libvterm-dev libpam-wrapper libbenchmark-dev
-  clang libclang-rt-14-dev
+  clang libclang-rt-14-dev clang-tidy clang-format
   less openssl openssh-client locales procps
   systemd man-db debootstrap systemd-container
 )

@@ -1,6 +1,7 @@
 // Whole-binary measurements of the real tulk in a pseudo-terminal (80x25,
 // TERM=xterm-256color): start-up to a settled screen, peak memory, bytes
-// written per key, and the cost of idling. Output: one line per figure,
+// written per key, how soon a key (and a lone Esc) is answered, and the
+// cost of idling. Output: one line per figure,
 // "name  median  min  max  unit", stable for scripts.
 //
 //   tulk-console-bench [--runs N] [--idle-seconds S]

@@ -12,22 +12,6 @@ namespace TulkBench {
 namespace {
 
 using Clock = std::chrono::steady_clock;
-using namespace std::chrono_literals;
-
-// Pumps output until nothing arrives for `quiet`; returns the time of the
-// last byte.
-Clock::time_point Settle(TulkTest::TestConsole& console, std::chrono::milliseconds quiet) {
-  Clock::time_point last = Clock::now();
-  std::size_t bytes = console.BytesReceived();
-  while (Clock::now() - last < quiet) {
-    console.Pump(1ms);
-    if (console.BytesReceived() != bytes) {
-      bytes = console.BytesReceived();
-      last = Clock::now();
-    }
-  }
-  return last;
-}
 
 // The demo host with console login allowed and the demo users.
 TulkTest::Options BenchOptions() {
@@ -41,22 +25,37 @@ TulkTest::Options BenchOptions() {
   return options;
 }
 
-// Bytes the console writes in answer to one key, after settling.
-double BytesForKey(TulkTest::TestConsole& console, const std::string& key) {
-  Settle(console, 150ms);
-  std::size_t before = console.BytesReceived();
+void Press(TulkTest::TestConsole& console, const std::string& key) {
   if (key.size() == 1) {
     console.Type(key);
   } else {
     console.Key(key);
   }
-  Settle(console, 150ms);
+}
+
+// Bytes the console writes in answer to one key: from the moment it waits
+// for the key to the moment it waits for the next.
+double BytesForKey(TulkTest::TestConsole& console, const std::string& key) {
+  console.WaitReady();
+  std::size_t before = console.BytesReceived();
+  Press(console, key);
+  console.WaitReady();
   return static_cast<double>(console.BytesReceived() - before);
+}
+
+// Milliseconds from sending a key to the console's own report that it has
+// drawn the answer and waits again.
+double MillisForKey(TulkTest::TestConsole& console, const std::string& key) {
+  console.WaitReady();
+  const Clock::time_point sent = Clock::now();
+  Press(console, key);
+  console.WaitReady();
+  return std::chrono::duration<double, std::milli>(console.ReadyAt() - sent).count();
 }
 
 void MeasureIdle(TulkTest::TestConsole& console, const BenchSettings& settings, Figure& cpu,
                  Figure& wakeups) {
-  Settle(console, 300ms);
+  console.WaitReady();
   ProcessUsage before = ReadUsage(console.Pid());
   std::this_thread::sleep_for(std::chrono::seconds(settings.idleSeconds));
   ProcessUsage after = ReadUsage(console.Pid());
@@ -65,19 +64,17 @@ void MeasureIdle(TulkTest::TestConsole& console, const BenchSettings& settings, 
 }
 
 bool OpenLogin(TulkTest::TestConsole& console) {
-  if (!console.WaitForText("Customize System/View Logs")) {
+  if (!console.WaitReady() || !console.Contains("Customize System/View Logs")) {
     return false;
   }
-  Settle(console, 150ms);
   console.Key("F2");
-  return console.WaitForText("Authentication Required");
+  return console.WaitReady() && console.Contains("Authentication Required");
 }
 
 bool LogIn(TulkTest::TestConsole& console) {
   if (!OpenLogin(console)) {
     return false;
   }
-  Settle(console, 150ms);
   console.Key("Down");
   console.Type("tulk");
   console.Key("Enter");
@@ -97,8 +94,9 @@ std::vector<Figure> RunScenarios(const BenchSettings& settings) {
     TulkTest::TestConsole console(BenchOptions());
     Clock::time_point start = Clock::now();
     console.Start();
-    Clock::time_point settled = Settle(console, 300ms);
-    startup.values.push_back(std::chrono::duration<double, std::milli>(settled - start).count());
+    console.WaitReady();
+    startup.values.push_back(
+        std::chrono::duration<double, std::milli>(console.ReadyAt() - start).count());
     peak.values.push_back(static_cast<double>(ReadUsage(console.Pid()).peakResidentKiB));
     welcomeBytes.values.push_back(static_cast<double>(console.BytesReceived()));
   }
@@ -116,6 +114,24 @@ std::vector<Figure> RunScenarios(const BenchSettings& settings) {
     MeasureIdle(console, settings, idleWelcomeCpu, idleWelcomeWakeups);
   }
   figures.insert(figures.end(), {anyKey, idleWelcomeCpu, idleWelcomeWakeups});
+
+  // Any key repaints the welcome screen; a lone Esc waits first for a
+  // sequence that might follow it. The extra time is the escape delay.
+  Figure plainKeyMillis{"welcome_key_to_ready_ms", "ms", {}};
+  Figure escMillis{"welcome_esc_to_ready_ms", "ms", {}};
+  Figure escDelay{"lone_esc_delay_ms", "ms", {}};
+  {
+    TulkTest::TestConsole console(BenchOptions());
+    console.Start();
+    for (int run = 0; run < settings.runs; ++run) {
+      const double plain = MillisForKey(console, "x");
+      const double esc = MillisForKey(console, "Esc");
+      plainKeyMillis.values.push_back(plain);
+      escMillis.values.push_back(esc);
+      escDelay.values.push_back(esc - plain);
+    }
+  }
+  figures.insert(figures.end(), {plainKeyMillis, escMillis, escDelay});
 
   Figure firstChar{"login_name_first_char_bytes", "bytes", {}};
   Figure nextChar{"login_name_next_char_bytes", "bytes", {}};

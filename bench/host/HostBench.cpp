@@ -1,13 +1,14 @@
 // Command runner and inventory queries, measured in a scratch root on the
 // built-in demo host:
 //   tulk-host-bench [--benchmark_filter=...]
-// The runner cases spawn a trivial program and wait for its captured exit;
-// the inventory cases run one query each.
+// The runner cases spawn a trivial program and wait for its captured exit,
+// or kill one at its time limit; the inventory cases run one query each.
 
 #include <benchmark/benchmark.h>
 #include <stdlib.h>
 #include <unistd.h>
 
+#include <chrono>
 #include <cstdint>
 #include <filesystem>
 #include <string>
@@ -45,6 +46,27 @@ void RunCapturedWithTimeout(benchmark::State& state) {
   }
 }
 BENCHMARK(RunCapturedWithTimeout)->Unit(benchmark::kMicrosecond)->UseRealTime();
+
+// A command that outlives its time limit of one second: the time from the
+// limit to the captured exit of the killed child ("past_limit_ms"). The
+// runner polls the child, so a late poll shows here.
+void KillAtTimeLimit(benchmark::State& state) {
+  double pastLimit = 0;
+  for (auto _ : state) {
+    const auto start = std::chrono::steady_clock::now();
+    int rc = Tulk::RunCommand("/bin/sh", {"sh", "-c", "sleep 5"}, nullptr, nullptr, nullptr,
+                              nullptr, nullptr, 0, 1);
+    pastLimit += std::chrono::duration<double, std::milli>(std::chrono::steady_clock::now() -
+                                                           start - std::chrono::seconds(1))
+                     .count();
+    if (rc != -1) {
+      state.SkipWithError("the command was not killed");
+    }
+  }
+  state.counters["past_limit_ms"] =
+      benchmark::Counter(pastLimit, benchmark::Counter::kAvgIterations);
+}
+BENCHMARK(KillAtTimeLimit)->Iterations(3)->Unit(benchmark::kMillisecond)->UseRealTime();
 
 void RunShellLine(benchmark::State& state) {
   for (auto _ : state) {
@@ -103,13 +125,12 @@ void GetVersionString(benchmark::State& state) {
 }
 BENCHMARK(GetVersionString)->DenseRange(1, 4);
 
-// A scratch root with the two programs the runner cases start, so nothing
-// of the real machine is run or changed.
-// Lays out a root whose /bin holds the few real programs the runner starts.
+// A scratch root whose /bin holds the few real programs the runner cases
+// start, so nothing of the real machine is run or changed.
 void PrepareRoot(const fs::path& root) {
   fs::create_directories(root / "bin");
   fs::create_directories(root / "sbin");
-  for (const char* program : {"true", "echo", "sh"}) {
+  for (const char* program : {"true", "echo", "sh", "sleep"}) {
     for (const char* folder : {"/usr/bin", "/bin"}) {
       fs::path real = fs::path(folder) / program;
       if (access(real.c_str(), X_OK) == 0) {

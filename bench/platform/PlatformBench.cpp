@@ -4,6 +4,7 @@
 #include <benchmark/benchmark.h>
 #include <stdlib.h>
 
+#include <cstdlib>
 #include <filesystem>
 #include <fstream>
 
@@ -121,6 +122,26 @@ void Change(benchmark::State& state) {
   }
 }
 BENCHMARK(Change)->Unit(benchmark::kMillisecond);
+
+#ifdef TULK_BENCH_HOSTTOOL
+// Laying the simulated tools out in a root that already holds them (every
+// screen test does it once for a fresh root, then again when asked).
+void InstallToolsAgain(benchmark::State& state) {
+  TulkBench::ScratchFolder root("tulk-bench-install");
+  const std::string install =
+      std::string(TULK_BENCH_HOSTTOOL) + " --install " + root.Path().string();
+  if (root.Path().empty() || std::system(install.c_str()) != 0) {
+    state.SkipWithError("install failed");
+    return;
+  }
+  for (auto _ : state) {
+    if (std::system(install.c_str()) != 0) {
+      state.SkipWithError("install failed");
+    }
+  }
+}
+BENCHMARK(InstallToolsAgain)->Unit(benchmark::kMillisecond)->UseRealTime();
+#endif
 
 }  // namespace
 

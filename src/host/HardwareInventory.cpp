@@ -18,11 +18,11 @@ namespace {
 using HostMgr::Lib::HostMgrException;
 
 constexpr std::uint64_t kRoundingMask = 0x0FFFFFFF;
-constexpr std::uint64_t kMebibyte = 1024 * 1024;
+constexpr std::uint64_t kMebibyte = std::uint64_t{1024} * 1024;
 constexpr char kUnitLetters[] = "MGTP";
 constexpr int kLastUnit = 3;
 
-std::string OrFiller(std::string text) {
+std::string OrFiller(const std::string& text) {
   return text.empty() ? std::string(kNotAvailable) : text;
 }
 

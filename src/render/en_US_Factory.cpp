@@ -53,6 +53,7 @@ constexpr const char* kTexts[] = {
     /* 20 */ "Operation on the management network interface failed.",
     /* 21 */ "Reset System Configuration: Error",
     /* 22 */
+    // NOLINTNEXTLINE(bugprone-suspicious-missing-comma): one text in two pieces
     "Failed to reset system configuration. Note that this operation cannot be performed when a "
     "managed DPU is present.",
     /* 23 */ "To prevent unauthorized access to this system, set the password for the user.",

@@ -12,6 +12,7 @@
 #include "include/Constants.h"
 #include "include/ProcessFlags.h"
 #include "runtime/Clock.h"
+#include "runtime/ReadySignal.h"
 #include "runtime/RuntimeFrame.h"
 #include "runtime/SignalThread.h"
 #include "runtime/SystemLog.h"
@@ -64,7 +65,10 @@ int PollInput(const timeval* limit, int wakeFd) {
   pollfd fds[3] = {{0, POLLIN, 0}, {SignalPipeReadFd(), POLLIN, 0}, {wakeFd, POLLIN, 0}};
   const nfds_t count = wakeFd >= 0 ? 3 : 2;
   int millis = limit == nullptr ? -1 : Clock::RealMilliseconds(limit->tv_sec, limit->tv_usec);
-  int ready = poll(fds, count, millis);
+  int ready = millis != 0 ? AnnounceReady(fds, count) : 0;
+  if (ready == 0) {
+    ready = poll(fds, count, millis);
+  }
   if (ready < 0) {
     LogErrno("poll() failed");
     return kPollOther;

@@ -39,7 +39,8 @@ inline constexpr long kDimSeconds = 60;
 /// for `limit` (null: without limit). Returns the curses key code, or one
 /// of the kPoll* values. With `wakeFd` >= 0 it also returns kPollWoken when
 /// that descriptor is readable (a key or a signal byte that is ready too
-/// comes first); the byte is left for its owner.
+/// comes first); the byte is left for its owner. Before a wait that can
+/// block, a test harness is told that the console is ready (ReadySignal.h).
 int PollInput(const timeval* limit, int wakeFd = -1);
 
 /// Returns the next key for `frame`. With `idleTimeout` true and a

@@ -19,7 +19,7 @@ void WritePidFile() {
   if (FILE* file = std::fopen(path.c_str(), "re"); file != nullptr) {
     long pid = 0;
     int fields = std::fscanf(file, "%ld", &pid);
-    std::fclose(file);
+    (void)std::fclose(file);  // read only: nothing to lose
     if (fields == 1 && pid > 0 && kill(static_cast<pid_t>(pid), 0) == 0) {
       Log(LOG_ERR, "Attempt to run multiple TULK instances, not updating %s", kPidFilePath);
       return;

@@ -18,7 +18,7 @@ void OpenSystemLog();
 
 /// Logs one line at the given syslog priority (optionally with a facility).
 void Log(int priority, const char* format, ...) __attribute__((format(printf, 2, 3)));
-void LogV(int priority, const char* format, va_list args);
+void LogV(int priority, const char* format, va_list args) __attribute__((format(printf, 2, 0)));
 
 /// Logs "<call> with errno(<errno>): <strerror>" at error priority.
 void LogErrno(const char* call);

@@ -65,6 +65,7 @@ std::vector<std::string> ChildEnvironment() {
 
 std::vector<char*> Pointers(std::vector<std::string>& strings) {
   std::vector<char*> pointers;
+  pointers.reserve(strings.size() + 1);
   for (std::string& text : strings) {
     pointers.push_back(text.data());
   }

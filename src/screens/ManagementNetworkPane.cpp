@@ -7,7 +7,7 @@ namespace Tulk {
 
 std::string FormatManagementNetworkView(const ManagementNetworkView& view, StringFactory& strings,
                                         int width) {
-  const std::string description = strings.GetString(TextId::kManagementNetworkDescription);
+  std::string description = strings.GetString(TextId::kManagementNetworkDescription);
   if (!view.found) {
     return description;
   }

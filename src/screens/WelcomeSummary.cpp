@@ -14,6 +14,7 @@ namespace {
 // the maths library into the console for one call: the sum is exact in
 // double precision and truncation is floor for non-negative values.
 float RoundHalfUp(float value) {
+  // NOLINTNEXTLINE(bugprone-incorrect-roundings): the values are never negative
   return static_cast<float>(static_cast<std::uint64_t>(static_cast<double>(value) + 0.5));
 }
 
@@ -50,7 +51,7 @@ std::string WelcomeSummary::NormaliseSpace(std::string_view text) {
 
 std::string WelcomeSummary::HardwareLine(std::string_view vendor, std::string_view product) {
   const std::string normalVendor = NormaliseSpace(vendor);
-  const std::string normalProduct = NormaliseSpace(product);
+  std::string normalProduct = NormaliseSpace(product);
   if (normalProduct.rfind(normalVendor, 0) == 0) {
     return normalProduct;
   }

@@ -7,12 +7,12 @@
 /// Keys (the dialog passes them with HandleKey() while the item is the
 /// current row; footers advertise "<Left/Right>" and "<D>"):
 ///
-/// | Key         | Effect |
-/// |-------------|--------|
-/// | Left        | the previous entry; from the first, the last |
-/// | Right       | the next entry; from the last, the first |
-/// | D or d      | opens the details dialog (DialogT, normally InfoDialog) for the current entry,
-/// above the owner frame |
+/// | Key    | Effect                                                                          |
+/// |--------|---------------------------------------------------------------------------------|
+/// | Left   | the previous entry; from the first, the last                                    |
+/// | Right  | the next entry; from the last, the first                                        |
+/// | D or d | opens the details dialog (DialogT, normally InfoDialog) for the current entry,  |
+/// |        | above the owner frame                                                           |
 ///
 /// The label is the entry's row (InfoType::Row(), the columns of
 /// InfoType::Heading()) between "< " and " >" when there is more than one

@@ -5,17 +5,19 @@
 ///
 /// Editing keys (curses key codes):
 ///
-/// | Key                    | Effect |
-/// |------------------------|--------|
-/// | Home                   | cursor to 0 |
-/// | Left                   | cursor back by one (at the first shown byte the field scrolls back by
-/// one) | | Right                  | cursor forward by one, not past the end | | End | cursor to
-/// the end | | Delete                 | pristine: empties the value; else removes the byte at the
-/// cursor | | Backspace, Ctrl-H      | pristine: empties the value; else removes the byte before
-/// the cursor; when the cursor then lies before the first shown byte, the field scrolls back to the
-/// start and the cursor jumps to the end of the value | | a printable key        | pristine:
-/// empties the value first; then inserts the key at the cursor | | any other key          |
-/// pristine: empties the value; nothing else |
+/// | Key               | Effect                                                                   |
+/// |-------------------|--------------------------------------------------------------------------|
+/// | Home              | cursor to 0                                                              |
+/// | Left              | cursor back by one (at the first shown byte the field scrolls back by 1) |
+/// | Right             | cursor forward by one, not past the end                                  |
+/// | End               | cursor to the end                                                        |
+/// | Delete            | pristine: empties the value; else removes the byte at the cursor         |
+/// | Backspace, Ctrl-H | pristine: empties the value; else removes the byte before the cursor (*) |
+/// | a printable key   | pristine: empties the value first; then inserts the key at the cursor    |
+/// | any other key     | pristine: empties the value; nothing else                                |
+///
+/// (*) When the cursor then lies before the first shown byte, the field
+/// scrolls back to the start and the cursor jumps to the end of the value.
 ///
 /// Every key ends the pristine state: moving onto a field and typing
 /// replaces its value, while Left, Right, Home or End first keep it.

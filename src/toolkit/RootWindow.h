@@ -4,19 +4,21 @@
 ///
 /// Geometry (COLS x LINES the screen, integer division, H = COLS / 2):
 ///
-/// | Part              | Parent     | Column, row   | Size                  | Colours |
-/// |-------------------|------------|---------------|-----------------------|---------|
-/// | frame             | screen     | 0, 0          | COLS x LINES          | black, white |
-/// | main area         | frame      | 0, 0          | COLS x (LINES-1), box, line on row 2 | light
-/// grey, white | | status line       | frame      | 0, LINES-1    | COLS x 1              | black,
-/// light grey | | left pane         | main area  | 0, 0          | H x (LINES-1)         | yellow,
-/// white | | right pane        | main area  | H, 0          | H x (LINES-1)         | dark grey,
-/// white | | left title text   | left pane  | 3, 1          | (H-6) x 1             | text black |
-/// | right title text  | right pane | 2, 1          | (H-6) x 1             | text white |
-/// | menu (ItemList)   | left pane  | 2, 4          | (H-2) x (LINES-7)     | |
-/// | description text  | right pane | 2, 4          | (H-4) x (LINES-7)     | text light grey |
-/// | left footer text  | left pane  | 2, LINES-3    | (H-3) x 1             | text black |
-/// | right footer text | right pane | 1, LINES-3    | (H-3) x 1             | text white |
+/// | Part              | Parent     | Column, row | Size              | Colours           |
+/// |-------------------|------------|-------------|-------------------|-------------------|
+/// | frame             | screen     | 0, 0        | COLS x LINES      | black, white      |
+/// | main area         | frame      | 0, 0        | COLS x (LINES-1)  | light grey, white |
+/// | status line       | frame      | 0, LINES-1  | COLS x 1          | black, light grey |
+/// | left pane         | main area  | 0, 0        | H x (LINES-1)     | yellow, white     |
+/// | right pane        | main area  | H, 0        | H x (LINES-1)     | dark grey, white  |
+/// | left title text   | left pane  | 3, 1        | (H-6) x 1         | text black        |
+/// | right title text  | right pane | 2, 1        | (H-6) x 1         | text white        |
+/// | menu (ItemList)   | left pane  | 2, 4        | (H-2) x (LINES-7) |                   |
+/// | description text  | right pane | 2, 4        | (H-4) x (LINES-7) | text light grey   |
+/// | left footer text  | left pane  | 2, LINES-3  | (H-3) x 1         | text black        |
+/// | right footer text | right pane | 1, LINES-3  | (H-3) x 1         | text white        |
+///
+/// The main area is boxed, with a line across on row 2.
 ///
 /// The menu and the description end on the row above the footers: were
 /// they one row taller, every draw of the menu or of a new description

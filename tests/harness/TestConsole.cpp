@@ -11,45 +11,16 @@
 #include <cerrno>
 #include <cstring>
 #include <fstream>
-#include <set>
 #include <sstream>
 #include <stdexcept>
 
 #include "KeyNames.h"
-
-extern char** environ;
+#include "ProcessHygiene.h"
 
 namespace TulkTest {
 namespace {
 
 using Clock = std::chrono::steady_clock;
-
-std::filesystem::path MakeFolder() {
-  std::string pattern = (std::filesystem::temp_directory_path() / "tulk-test-XXXXXX").string();
-  if (mkdtemp(pattern.data()) == nullptr) {
-    throw std::runtime_error("mkdtemp failed: " + std::string(std::strerror(errno)));
-  }
-  return pattern;
-}
-
-void RunToCompletion(const std::vector<std::string>& argv) {
-  pid_t pid = fork();
-  if (pid == 0) {
-    std::vector<char*> args;
-    for (const std::string& arg : argv) {
-      args.push_back(const_cast<char*>(arg.c_str()));
-    }
-    args.push_back(nullptr);
-    execv(args[0], args.data());
-    _exit(127);
-  }
-  int status = 0;
-  while (pid > 0 && waitpid(pid, &status, 0) < 0 && errno == EINTR) {
-  }
-  if (pid < 0 || !WIFEXITED(status) || WEXITSTATUS(status) != 0) {
-    throw std::runtime_error("failed to run " + argv[0]);
-  }
-}
 
 }  // namespace
 
@@ -61,26 +32,8 @@ std::string HostToolBinary() {
   return TULK_TEST_HOSTTOOL_BINARY;
 }
 
-TestConsole::TestConsole(Options options) : options_(std::move(options)) {
-  folder_ = MakeFolder();
-  root_ = folder_ / "root";
-  logPath_ = folder_ / "syslog.txt";
-  for (const char* sub : {"var/run", "var/log", "etc", "tmp"}) {
-    std::filesystem::create_directories(root_ / sub);
-  }
-  std::string tool = HostToolBinary();
-  if (options_.hostTools && !tool.empty() && std::filesystem::exists(tool)) {
-    RunToCompletion({tool, "--install", root_.string()});
-  }
-  if (options_.hostState) {
-    std::ofstream(HostStatePath()) << *options_.hostState;
-  }
-  if (!options_.pamUsers.empty()) {
-    WritePamServices();
-  }
-  if (options_.prepareRoot) {
-    options_.prepareRoot(root_);
-  }
+TestConsole::TestConsole(Options options)
+    : options_(std::move(options)), folder_(options_, HostToolBinary()) {
   terminal_ = std::make_unique<VirtualTerminal>(options_.rows, options_.cols);
   if (options_.start) {
     Start();
@@ -88,103 +41,9 @@ TestConsole::TestConsole(Options options) : options_(std::move(options)) {
 }
 
 TestConsole::~TestConsole() {
-  if (Running()) {
-    kill(pid_, SIGKILL);
-    Reap(true);
-  }
+  Stop();
   if (master_ >= 0) {
     close(master_);
-  }
-  if (std::getenv("TULK_KEEP_TEST_ROOT") == nullptr) {
-    std::error_code ignored;
-    std::filesystem::remove_all(folder_, ignored);
-  }
-}
-
-std::vector<std::string> TestConsole::BuildEnvironment() const {
-  std::map<std::string, std::string> env;
-  for (char** entry = environ; *entry != nullptr; ++entry) {
-    std::string text = *entry;
-    auto equals = text.find('=');
-    if (equals != std::string::npos) {
-      env[text.substr(0, equals)] = text.substr(equals + 1);
-    }
-  }
-  for (const char* name : {"TULK_ROOT", "TULK_HOST_STATE", "TULK_LOG_FILE", "TULK_TIME_SCALE",
-                           "SSH_CLIENT", "TERMINFO", "TULK_SIM_DEMO_FILE", "LESSSECURE"}) {
-    env.erase(name);
-  }
-  env["TULK_ROOT"] = root_.string();
-  env["TULK_LOG_FILE"] = logPath_.string();
-  env["TMPDIR"] = folder_.string();
-  if (options_.term.empty()) {
-    env.erase("TERM");
-  } else {
-    env["TERM"] = options_.term;
-  }
-  if (options_.hostState) {
-    env["TULK_HOST_STATE"] = HostStatePath().string();
-  }
-  if (options_.timeScale > 0) {
-    std::ostringstream scale;
-    scale << options_.timeScale;
-    env["TULK_TIME_SCALE"] = scale.str();
-  }
-  if (!options_.pamUsers.empty()) {
-    env["LD_PRELOAD"] = TULK_TEST_PAM_WRAPPER_LIBRARY;
-    env["PAM_WRAPPER"] = "1";
-    env["PAM_WRAPPER_SERVICE_DIR"] = (folder_ / "pam").string();
-#ifdef TULK_TEST_SANITIZED
-    // The sanitizer runtime cannot come first when a library is preloaded.
-    // pam_wrapper loads libpam with RTLD_DEEPBIND, which the sanitizer
-    // runtime refuses; this release reads the switch under the name of its
-    // sibling wrapper, so both names are set.
-    env["PAM_WRAPPER_DISABLE_DEEPBIND"] = "1";
-    env["UID_WRAPPER_DISABLE_DEEPBIND"] = "1";
-    std::string asan = env.count("ASAN_OPTIONS") != 0 ? env["ASAN_OPTIONS"] + ":" : "";
-    env["ASAN_OPTIONS"] = asan + "verify_asan_link_order=0";
-#endif
-  }
-  for (const auto& [name, value] : options_.env) {
-    env[name] = value;
-  }
-  for (const std::string& name : options_.unsetEnv) {
-    env.erase(name);
-  }
-  std::vector<std::string> result;
-  for (const auto& [name, value] : env) {
-    result.push_back(name + "=" + value);
-  }
-  return result;
-}
-
-void TestConsole::WritePamServices() {
-  std::filesystem::path services = folder_ / "pam";
-  std::filesystem::create_directories(services);
-  {
-    std::ofstream passdb(services / "passdb");
-    for (const auto& [user, password] : options_.pamUsers) {
-      passdb << user << ":" << password << ":tulk\n";
-    }
-  }
-  {
-    std::ofstream policy(services / "policy");
-    for (const std::string& line : options_.pamPolicy) {
-      policy << line << "\n";
-    }
-  }
-  const std::string matrix =
-      std::string(TULK_TEST_PAM_MATRIX_MODULE) + " passdb=" + (services / "passdb").string();
-  const std::string policy =
-      std::string(TULK_TEST_PAM_POLICY_MODULE) + " policy=" + (services / "policy").string();
-  for (const char* service : {"tulk", "other"}) {
-    std::ofstream file(services / service);
-    file << "auth     required  " << matrix << "\n"
-         << "account  requisite " << policy << "\n"
-         << "account  required  " << matrix << "\n"
-         << "password requisite " << policy << "\n"
-         << "password required  " << matrix << "\n"
-         << "session  required  " << matrix << "\n";
   }
 }
 
@@ -192,17 +51,20 @@ void TestConsole::Start() {
   std::string program = options_.program.empty() ? TulkBinary() : options_.program;
   std::vector<std::string> argv{program};
   argv.insert(argv.end(), options_.args.begin(), options_.args.end());
-  std::vector<std::string> env = BuildEnvironment();
+  std::vector<std::string> env =
+      folder_.Environment(options_, {{"TULK_READY_FD", std::to_string(ReadyChannel::kChildFd)}});
 
   winsize size{};
   size.ws_row = static_cast<unsigned short>(options_.rows);
   size.ws_col = static_cast<unsigned short>(options_.cols);
+  NoteSent();
   pid_ = forkpty(&master_, nullptr, nullptr, &size);
   if (pid_ < 0) {
     throw std::runtime_error("forkpty failed: " + std::string(std::strerror(errno)));
   }
   if (pid_ == 0) {
-    close_range(3, ~0U, 0);
+    ready_.PassToChild();
+    close_range(ReadyChannel::kChildFd + 1, ~0U, 0);
     sigset_t none;
     sigemptyset(&none);
     sigprocmask(SIG_SETMASK, &none, nullptr);
@@ -216,19 +78,53 @@ void TestConsole::Start() {
       envp.push_back(const_cast<char*>(entry.c_str()));
     }
     envp.push_back(nullptr);
-    chdir(folder_.c_str());
+    chdir(folder_.Path().c_str());
     execve(args[0], args.data(), envp.data());
     _exit(127);
   }
+  ready_.CloseWriteEnd();
   fcntl(master_, F_SETFL, fcntl(master_, F_GETFL) | O_NONBLOCK);
   fcntl(master_, F_SETFD, FD_CLOEXEC);
 }
 
-void TestConsole::Key(std::string_view name, int times) {
-  std::string bytes = KeyBytes(name);
-  for (int i = 0; i < times; ++i) {
-    Send(bytes);
+void TestConsole::Stop() {
+  if (pid_ <= 0 || reaped_) {
+    return;
   }
+  if (!exitStatus_) {
+    // A terminating signal ends the console through exit(): pam_wrapper
+    // removes its folder then, and the sanitizers run their exit checks.
+    kill(pid_, SIGTERM);
+    const auto deadline = std::chrono::steady_clock::now() + 5s;
+    while (!exitStatus_ && std::chrono::steady_clock::now() < deadline) {
+      Pump(10ms);
+      CheckExit(false);
+    }
+    if (!exitStatus_) {
+      kill(pid_, SIGKILL);
+      CheckExit(true);
+    }
+  }
+  std::vector<pid_t> ended = SignalSession(pid_, SIGKILL);
+  ended.push_back(pid_);
+  if (!options_.pamUsers.empty()) {
+    RemovePamFolders(folder_.Path().string() + "/", ended);
+  }
+  while (waitpid(pid_, nullptr, 0) < 0 && errno == EINTR) {
+  }
+  reaped_ = true;
+}
+
+void TestConsole::NoteSent() {
+  lastSent_ = ReadyChannel::Now();
+}
+
+void TestConsole::Key(std::string_view name, int times) {
+  std::string bytes;
+  for (int i = 0; i < times; ++i) {
+    bytes += KeyBytes(name);
+  }
+  Send(bytes);
 }
 
 void TestConsole::Type(std::string_view text) {
@@ -236,6 +132,35 @@ void TestConsole::Type(std::string_view text) {
 }
 
 void TestConsole::Send(std::string_view bytes) {
+  AwaitTurn();
+  Write(bytes);
+}
+
+void TestConsole::SendNow(std::string_view bytes) {
+  Write(bytes);
+}
+
+void TestConsole::AwaitTurn() {
+  if (!Running()) {
+    return;
+  }
+  ready_.Read();
+  // Only while the program itself holds the terminal: a pager in front of
+  // it reads the keys, and the program reports nothing until it is back.
+  if (ready_.Newest() <= lastSent_ && tcgetpgrp(master_) == pid_) {
+    auto ready = WaitReady();
+    if (!ready && Running()) {
+      ADD_FAILURE() << "input waited for its turn in vain (SendNow() sends at once): "
+                    << ready.message();
+    }
+  }
+}
+
+void TestConsole::Write(std::string_view bytes) {
+  if (bytes.empty()) {
+    return;  // no input: nothing the program could report about
+  }
+  NoteSent();
   while (!bytes.empty()) {
     ssize_t written = write(master_, bytes.data(), bytes.size());
     if (written < 0) {
@@ -250,7 +175,9 @@ void TestConsole::Send(std::string_view bytes) {
 }
 
 void TestConsole::Signal(int signal) {
+  AwaitTurn();
   if (Running()) {
+    NoteSent();
     kill(pid_, signal);
   }
 }
@@ -259,6 +186,8 @@ void TestConsole::Resize(int cols, int rows) {
   winsize size{};
   size.ws_row = static_cast<unsigned short>(rows);
   size.ws_col = static_cast<unsigned short>(cols);
+  AwaitTurn();
+  NoteSent();
   ioctl(master_, TIOCSWINSZ, &size);
   terminal_->Resize(rows, cols);
 }
@@ -270,31 +199,89 @@ void TestConsole::Pump(Millis timeout) {
   auto deadline = Clock::now() + timeout;
   for (;;) {
     auto left = std::chrono::duration_cast<Millis>(deadline - Clock::now());
-    pollfd fd{master_, POLLIN, 0};
-    int ready = poll(&fd, 1, static_cast<int>(std::max<long>(left.count(), 0)));
+    pollfd fds[2] = {{master_, POLLIN, 0}, {ready_.ReadEnd(), POLLIN, 0}};
+    int ready = poll(fds, 2, static_cast<int>(std::max<long>(left.count(), 0)));
     if (ready <= 0) {
       return;
     }
-    char buffer[8192];
-    ssize_t got = read(master_, buffer, sizeof buffer);
-    if (got <= 0) {
-      if (got < 0 && (errno == EAGAIN || errno == EINTR)) {
-        continue;
+    if ((fds[1].revents & POLLIN) != 0) {
+      ready_.Read();
+    }
+    if ((fds[0].revents & (POLLIN | POLLHUP | POLLERR)) != 0) {
+      char buffer[8192];
+      ssize_t got = read(master_, buffer, sizeof buffer);
+      if (got < 0 && errno != EAGAIN && errno != EINTR) {
+        return;  // EIO: the program closed the terminal
       }
-      return;  // EIO: the program closed the terminal
-    }
-    bytesReceived_ += static_cast<std::size_t>(got);
-    if (options_.keepOutput) {
-      output_.append(buffer, static_cast<std::size_t>(got));
-    }
-    terminal_->Write(std::string_view(buffer, static_cast<std::size_t>(got)));
-    std::string replies = terminal_->TakeReplies();
-    if (!replies.empty()) {
-      Send(replies);
+      if (got > 0) {
+        Absorb(buffer, static_cast<std::size_t>(got));
+      } else if (got == 0 || (fds[0].revents & POLLIN) == 0) {
+        return;
+      }
     }
     // Keep reading what is already there, without waiting any longer.
     deadline = std::min(deadline, Clock::now());
   }
+}
+
+void TestConsole::DrainOutput() {
+  // read() on the pseudo-terminal, unlike poll(), first waits for the
+  // kernel to pass on what the program has written: all output sent before
+  // a readiness report is read here.
+  char buffer[8192];
+  for (;;) {
+    ssize_t got = read(master_, buffer, sizeof buffer);
+    if (got < 0 && errno == EINTR) {
+      continue;
+    }
+    if (got <= 0) {
+      return;
+    }
+    Absorb(buffer, static_cast<std::size_t>(got));
+  }
+}
+
+void TestConsole::Absorb(const char* bytes, std::size_t count) {
+  bytesReceived_ += count;
+  if (options_.keepOutput) {
+    output_.append(bytes, count);
+  }
+  terminal_->Write(std::string_view(bytes, count));
+  std::string replies = terminal_->TakeReplies();
+  if (!replies.empty()) {
+    Write(replies);  // the program may be waiting for them: no turn to await
+  }
+}
+
+::testing::AssertionResult TestConsole::WaitReady(Millis timeout) {
+  auto deadline = Clock::now() + timeout;
+  for (;;) {
+    ready_.Read();
+    if (ready_.Newest() > lastSent_) {
+      DrainOutput();
+      if (ready_.Newest() > lastSent_) {  // unless draining sent a reply
+        return ::testing::AssertionSuccess();
+      }
+      continue;
+    }
+    CheckExit(false);
+    if (exitStatus_) {
+      Pump(0ms);
+      return ::testing::AssertionFailure()
+             << "the program ended (status " << *exitStatus_ << ") instead of waiting for a key\n"
+             << Dump();
+    }
+    if (Clock::now() >= deadline) {
+      return ::testing::AssertionFailure()
+             << "the program did not wait for a key within " << timeout.count() << " ms\n"
+             << Dump();
+    }
+    Pump(20ms);
+  }
+}
+
+std::chrono::steady_clock::time_point TestConsole::ReadyAt() const {
+  return std::chrono::steady_clock::time_point(std::chrono::nanoseconds(ready_.Newest()));
 }
 
 ::testing::AssertionResult TestConsole::WaitForText(std::string_view text, Millis timeout) {
@@ -329,6 +316,21 @@ void TestConsole::Pump(Millis timeout) {
   }
 }
 
+::testing::AssertionResult TestConsole::WaitUntil(const std::function<bool()>& condition,
+                                                  std::string_view what, Millis timeout) {
+  auto deadline = Clock::now() + timeout;
+  for (;;) {
+    Pump(0ms);
+    if (condition()) {
+      return ::testing::AssertionSuccess();
+    }
+    if (Clock::now() >= deadline) {
+      return ::testing::AssertionFailure() << "timed out waiting for " << what << "\n" << Dump();
+    }
+    Pump(20ms);
+  }
+}
+
 ::testing::AssertionResult TestConsole::WaitForLog(std::string_view text, Millis timeout) {
   auto deadline = Clock::now() + timeout;
   for (;;) {
@@ -350,28 +352,17 @@ void TestConsole::Pump(Millis timeout) {
   }
 }
 
-void TestConsole::WaitQuiet(Millis quiet, Millis timeout) {
-  auto deadline = Clock::now() + timeout;
-  while (Clock::now() < deadline) {
-    std::size_t before = bytesReceived_;
-    Pump(quiet);
-    if (bytesReceived_ == before) {
-      return;
-    }
-  }
-}
-
-void TestConsole::Reap(bool block) {
-  if (pid_ <= 0 || exitStatus_) {
+void TestConsole::CheckExit(bool block) {
+  if (pid_ <= 0 || exitStatus_ || reaped_) {
     return;
   }
-  int status = 0;
-  pid_t done;
+  siginfo_t info{};
+  int done;
   do {
-    done = waitpid(pid_, &status, block ? 0 : WNOHANG);
+    done = waitid(P_PID, static_cast<id_t>(pid_), &info, WEXITED | WNOWAIT | (block ? 0 : WNOHANG));
   } while (done < 0 && errno == EINTR);
-  if (done == pid_) {
-    exitStatus_ = WIFEXITED(status) ? WEXITSTATUS(status) : 128 + WTERMSIG(status);
+  if (done == 0 && info.si_pid == pid_) {
+    exitStatus_ = info.si_code == CLD_EXITED ? info.si_status : 128 + info.si_status;
   }
 }
 
@@ -379,9 +370,9 @@ std::optional<int> TestConsole::WaitExit(Millis timeout) {
   auto deadline = Clock::now() + timeout;
   for (;;) {
     Pump(0ms);
-    Reap(false);
+    CheckExit(false);
     if (exitStatus_) {
-      Pump(0ms);
+      DrainOutput();
       return exitStatus_;
     }
     if (Clock::now() >= deadline) {
@@ -445,7 +436,7 @@ std::string TestConsole::Dump() const {
 
 std::vector<std::string> TestConsole::LogLines() const {
   std::vector<std::string> lines;
-  std::ifstream in(logPath_);
+  std::ifstream in(folder_.LogPath());
   std::string line;
   while (std::getline(in, line)) {
     lines.push_back(line);

@@ -79,24 +79,17 @@ TEST_F(CommandRunnerTest, ProgramsAndPathStayInsideTheRoot) {
             "alice||" + path + "|" + root + "\n");
 }
 
-TEST_F(CommandRunnerTest, TimeoutKillsWithinTwentyMillisecondsOfTheDeadline) {
-  // The closest of up to three runs: late polling makes every run late, a
-  // busy test machine only some. 25 ms of scheduling slack on top.
-  auto closest = std::chrono::steady_clock::duration::max();
-  for (int run = 0; run < 3 && closest >= 1s + 20ms + 25ms; ++run) {
-    auto start = std::chrono::steady_clock::now();
-    EXPECT_EQ(Shell("sleep 5", "", 1).rc, -1);
-    auto elapsed = std::chrono::steady_clock::now() - start;
-    EXPECT_GE(elapsed, 1s);
-    closest = std::min(closest, elapsed);
-  }
-  EXPECT_LT(closest, 1s + 20ms + 25ms);
+TEST_F(CommandRunnerTest, TimeoutKillsTheCommandAndLogsIt) {
+  // How soon after the limit the kill comes is measured in bench/host.
+  const auto start = std::chrono::steady_clock::now();
+  EXPECT_EQ(Shell("sleep 5", "", 1).rc, -1);
+  EXPECT_GE(std::chrono::steady_clock::now() - start, 1s);
   EXPECT_TRUE(Logged("<12>Killing process because 1 seconds timeout expired"));
 
-  // A child that ends in time is not held up by the polling.
-  auto start = std::chrono::steady_clock::now();
-  EXPECT_EQ(Shell("printf done; exit 4", "", 30).rc, 4);
-  EXPECT_LT(std::chrono::steady_clock::now() - start, 500ms);
+  // A child that ends within its limit keeps its status and output.
+  const Result done = Shell("printf done; exit 4", "", 30);
+  EXPECT_EQ(done.rc, 4);
+  EXPECT_EQ(done.output, "done");
 }
 
 TEST_F(CommandRunnerTest, CaptureIsCutAtTheBufferAndAlwaysTerminated) {

@@ -222,10 +222,8 @@ TEST(HostTools, OverridesSetExitCodeOutputAndDelay) {
 TEST(HostTools, InstallLaysOutARootRepeatedly) {
   ScratchHost host;
   const auto root = host.Root();
-  const auto start = std::chrono::steady_clock::now();
   Finished again = SimTest::RunProgram({TULK_TEST_HOSTTOOL, "--install", root.string()});
   EXPECT_EQ(again.status, 0) << again.err;
-  EXPECT_LT(std::chrono::steady_clock::now() - start, std::chrono::milliseconds(500));
   for (const char* path : {"bin/tavcli",
                            "sbin/tavcli",
                            "sbin/localcli",

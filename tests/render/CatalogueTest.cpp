@@ -12,17 +12,6 @@ Tulk::StringFactory& Catalogue() {
   return *Tulk::GetStringFactory("en_US");
 }
 
-TEST(CatalogueTest, SharedNumbersGiveOneStoredText) {
-  const std::pair<unsigned, unsigned> kShared[] = {
-      {1, 170}, {5, 157},  {6, 254},  {7, 46},   {8, 133},  {9, 217},  {10, 64}, {14, 182},
-      {47, 77}, {49, 101}, {50, 106}, {53, 124}, {68, 209}, {69, 138}, {70, 197}};
-  for (auto [first, second] : kShared) {
-    EXPECT_EQ(Catalogue().GetString(first), Catalogue().GetString(second))
-        << first << " and " << second;
-  }
-  EXPECT_STREQ(Catalogue().GetString(170), "Shut Down/Restart");
-}
-
 TEST(CatalogueTest, ThreeAndEveryNumberAboveTheLastAreEmpty) {
   EXPECT_STREQ(Catalogue().GetString(3), "");
   for (unsigned id : {292u, 293u, 1000u, 0xffffffffu}) {
@@ -30,14 +19,6 @@ TEST(CatalogueTest, ThreeAndEveryNumberAboveTheLastAreEmpty) {
   }
   EXPECT_STREQ(Catalogue().GetString(291),
                "Please choose which Hykernel NIC should be migrated to which portgroup/switch.");
-}
-
-TEST(CatalogueTest, TextsKeepTheirNewlinesAndMarkup) {
-  EXPECT_STREQ(Catalogue().GetString(29),
-               "Press the corresponding key to view a log.\nPress <Q> to return to this screen.");
-  EXPECT_EQ(std::string(Catalogue().GetString(247)).rfind("{color:red}Warning! ", 0), 0u);
-  // Two blanks after "allowed." are part of the text.
-  EXPECT_NE(std::string(Catalogue().GetString(268)).find("allowed.  Changes"), std::string::npos);
 }
 
 TEST(CatalogueTest, VersionLineFollowsTheSourceAndKeepsTheLastGoodText) {

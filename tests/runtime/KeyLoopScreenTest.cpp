@@ -1,10 +1,10 @@
 // The key loop through the test-only key-echo program: the key table as
-// curses assembles it, Esc latency, dimming, idle timeouts and signals.
+// curses assembles it, the lone Esc, dimming, idle timeouts and signals.
+// How fast a lone Esc acts is measured in bench/console.
 
 #include <gtest/gtest.h>
 #include <signal.h>
 
-#include <algorithm>
 #include <chrono>
 #include <string>
 #include <thread>
@@ -52,28 +52,19 @@ TEST(KeyLoop, TerminalSequencesArriveAsCursesKeys) {
   for (const Case& c : cases) {
     console.Send(c.bytes);
     ++keys;
-    ASSERT_TRUE(console.WaitForText("keys: " + std::to_string(keys))) << c.shown;
+    ASSERT_TRUE(console.WaitReady()) << c.shown;
+    EXPECT_TRUE(console.Contains("keys: " + std::to_string(keys))) << c.shown << console.Dump();
     EXPECT_TRUE(console.Contains(std::string("last key: ") + c.shown)) << console.Dump();
   }
 }
 
-TEST(KeyLoop, LoneEscActsWithinFiftyMilliseconds) {
+TEST(KeyLoop, LoneEscArrivesAsEsc) {
   TestConsole console(KeyEcho());
-  ASSERT_TRUE(console.WaitForText("KEYECHO active"));
-  // The fastest of three presses: a wrong escape delay slows every one of
-  // them, a busy test machine only some.
-  auto fastest = std::chrono::steady_clock::duration::max();
-  for (int press = 1; press <= 3 && fastest >= 50ms; ++press) {
-    console.WaitQuiet();
-    auto sent = std::chrono::steady_clock::now();
-    console.Key("Esc");
-    ASSERT_TRUE(console.WaitForText("keys: " + std::to_string(press), 2000ms));
-    fastest = std::min(fastest, std::chrono::steady_clock::now() - sent);
-    EXPECT_TRUE(console.Contains("(27)")) << console.Dump();
-  }
-  EXPECT_LT(fastest, 50ms) << "Esc took "
-                           << std::chrono::duration_cast<std::chrono::milliseconds>(fastest).count()
-                           << " ms";
+  ASSERT_TRUE(console.WaitReady());
+  console.Key("Esc");
+  ASSERT_TRUE(console.WaitReady());
+  EXPECT_TRUE(console.Contains("keys: 1")) << console.Dump();
+  EXPECT_TRUE(console.Contains("(27)")) << console.Dump();
 }
 
 TEST(KeyLoop, KeyRightAfterEscIsNotHeldBack) {
@@ -84,19 +75,50 @@ TEST(KeyLoop, KeyRightAfterEscIsNotHeldBack) {
   console.Send(
       "\x1b"
       "a");
-  ASSERT_TRUE(console.WaitForText("keys: 2", 1000ms));
+  ASSERT_TRUE(console.WaitReady());
+  EXPECT_TRUE(console.Contains("keys: 2")) << console.Dump();
   EXPECT_TRUE(console.Contains("last key: a (97)")) << console.Dump();
 }
 
-TEST(KeyLoop, SequenceSplitLikeASlowSerialLineIsStillAssembled) {
+TEST(KeyLoop, ReadyOnlyOnceEveryKeySentHasBeenHandled) {
   TestConsole console(KeyEcho());
+  ASSERT_TRUE(console.WaitReady());
+  // Separate writes: the console may finish a key before the next arrives,
+  // and its report in between must not count as the end of the last one.
+  for (const char* key : {"a", "b", "c", "d"}) {
+    console.Send(key);
+  }
+  ASSERT_TRUE(console.WaitReady());
+  EXPECT_TRUE(console.Contains("keys: 4")) << console.Dump();
+}
+
+TEST(KeyLoop, ReadinessDescriptorOnTheTerminalIsIgnored) {
+  Options options = KeyEcho();
+  options.keepOutput = true;
+  options.env["TULK_READY_FD"] = "1";
+  TestConsole console(options);
   ASSERT_TRUE(console.WaitForText("KEYECHO active"));
+  console.SendNow("a");  // no reports come to wait for
+  ASSERT_TRUE(console.WaitForText("keys: 1"));
+  // A report is a binary clock reading with zero bytes; curses never
+  // writes one.
+  EXPECT_EQ(console.Output().find('\0'), std::string::npos);
+}
+
+TEST(KeyLoop, SequenceSplitLikeASlowSerialLineIsStillAssembled) {
+  Options options = KeyEcho();
+  // A busy test machine may hold the harness back between two bytes longer
+  // than the default delay; a slow line's operator would set it so.
+  options.env["ESCDELAY"] = "1000";
+  TestConsole console(options);
+  ASSERT_TRUE(console.WaitReady());
   // 9600 baud: about one millisecond per byte.
   for (const char* byte : {"\x1b", "[", "2", "4", "~"}) {
-    console.Send(byte);
+    console.SendNow(byte);
     std::this_thread::sleep_for(2ms);
   }
-  ASSERT_TRUE(console.WaitForText("keys: 1"));
+  ASSERT_TRUE(console.WaitReady());
+  EXPECT_TRUE(console.Contains("keys: 1")) << console.Dump();
   EXPECT_TRUE(console.Contains("last key: KEY_F(12)")) << console.Dump();
 }
 
@@ -104,10 +126,11 @@ TEST(KeyLoop, DimsAfterAMinuteAndTheWakingKeyIsDelivered) {
   Options options = KeyEcho();
   options.timeScale = 300;  // one console minute = 0.2 s
   TestConsole console(options);
-  ASSERT_TRUE(console.WaitForText("KEYECHO dimmed", 2000ms));
+  ASSERT_TRUE(console.WaitForText("KEYECHO dimmed"));
   EXPECT_EQ(console.At(1, 2).fg, Tulk::kDarkGrey);
   console.Type("a");
-  ASSERT_TRUE(console.WaitForText("last key: a (97)"));
+  ASSERT_TRUE(console.WaitReady());
+  EXPECT_TRUE(console.Contains("last key: a (97)")) << console.Dump();
   EXPECT_TRUE(console.Contains("KEYECHO active")) << console.Dump();
   EXPECT_EQ(console.At(1, 2).fg, Tulk::kWhite);
 }
@@ -115,15 +138,17 @@ TEST(KeyLoop, DimsAfterAMinuteAndTheWakingKeyIsDelivered) {
 TEST(KeyLoop, IdleTimeoutBelowAMinuteCountsAsAMinute) {
   Options options = KeyEcho();
   options.timeScale = 60;
+  options.keepOutput = true;
   options.env["TULK_KEYECHO_SESSION"] = "1";
   options.env["TULK_KEYECHO_IDLE_TIMEOUT"] = "30";
   TestConsole console(options);
-  ASSERT_TRUE(console.WaitForText("timeout after:", 3000ms));
-  // Console seconds from the start of the wait; a few may pass while the
-  // program is scheduled (one console second is 17 ms here).
+  ASSERT_TRUE(console.WaitForText("timeout after:"));
+  // Not before the minute (console seconds from the start of the wait)...
   int seconds = std::stoi(console.Row(8).substr(console.Row(8).find(':') + 1));
   EXPECT_GE(seconds, 60) << console.Dump();
-  EXPECT_LT(seconds, 70) << console.Dump();
+  // ...and not after it: the screen dims at the minute, so a later timeout
+  // would have dimmed it first.
+  EXPECT_EQ(console.Output().find("dimmed"), std::string::npos);
 }
 
 TEST(KeyLoop, IdleTimeoutOfZeroNeverEndsTheSessionButStillDims) {
@@ -132,9 +157,10 @@ TEST(KeyLoop, IdleTimeoutOfZeroNeverEndsTheSessionButStillDims) {
   options.env["TULK_KEYECHO_SESSION"] = "1";
   options.env["TULK_KEYECHO_IDLE_TIMEOUT"] = "0";
   TestConsole console(options);
-  ASSERT_TRUE(console.WaitForText("KEYECHO dimmed", 2000ms));
-  console.Pump(500ms);  // five console minutes
-  EXPECT_FALSE(console.Contains("timeout after")) << console.Dump();
+  ASSERT_TRUE(console.WaitForText("KEYECHO dimmed"));
+  // What never happens can only be watched for a while: fifteen console
+  // minutes, past the ten a misread "0" would fall back to.
+  EXPECT_FALSE(console.WaitForText("timeout after", 1500ms));
 }
 
 TEST(KeyLoop, UnreadableTimeoutDefaultsToTenMinutes) {
@@ -159,15 +185,16 @@ TEST(KeyLoop, ExitRequestDuringASessionIsDeferred) {
   TestConsole console(options);
   ASSERT_TRUE(console.WaitForText("exitPending: 0"));
   console.Signal(SIGUSR2);
-  // A key and the signal may arrive together (the key is read first); keep
-  // typing until a redraw shows the flag.
+  // The signal thread passes the signal on in its own time, and the flag is
+  // drawn with the next key: keep typing until a redraw shows it.
+  const auto deadline = std::chrono::steady_clock::now() + TulkTest::kWait;
   bool shown = false;
-  for (int i = 0; i < 50 && !shown; ++i) {
+  while (!shown && std::chrono::steady_clock::now() < deadline) {
     console.Type("x");
-    shown = console.WaitForText("exitPending: 1", 20ms);
+    ASSERT_TRUE(console.WaitReady());
+    shown = console.Contains("exitPending: 1");
   }
   EXPECT_TRUE(shown) << console.Dump();
-  console.Pump(50ms);
   EXPECT_TRUE(console.Running());
 }
 

@@ -34,14 +34,6 @@ class PaletteTest : public ::testing::Test {
   SCREEN* screen_ = nullptr;
 };
 
-TEST_F(PaletteTest, PairNumberIsForegroundPlusColorsTimesBackgroundPlusOne) {
-  ASSERT_EQ(COLORS, 256);
-  EXPECT_EQ(Tulk::ColorAttr(Tulk::kBlack, Tulk::kWhite).pair, 8);
-  EXPECT_EQ(Tulk::ColorAttr(Tulk::kYellow, Tulk::kBlack).pair, 769);
-  EXPECT_EQ(Tulk::ColorAttr(Tulk::kWhite, Tulk::kDarkGrey).pair, 1799);
-  EXPECT_EQ(Tulk::ColorAttr(Tulk::kRed, Tulk::kRed).attrs, A_NORMAL);
-}
-
 TEST_F(PaletteTest, InitColorsCreatesThirtySixPairsWithTheRedefinedPalette) {
   Tulk::InitColors();
   ASSERT_FALSE(Tulk::monochrome);

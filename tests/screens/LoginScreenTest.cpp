@@ -17,7 +17,6 @@ using SessionTest::LogIn;
 using SessionTest::RecordsWhere;
 using SessionTest::RowOf;
 using SessionTest::Settled;
-using SessionTest::WaitUntil;
 using TulkTest::DemoHostState;
 using TulkTest::TestConsole;
 
@@ -27,7 +26,6 @@ TEST(LoginScreenTest, NamePasswordModeAndEscLeavesNoTrace) {
   const std::size_t logBefore = console.LogLines().size();
   console.Key("F2");
   ASSERT_TRUE(Settled(console, "Authentication Required"));
-  console.WaitQuiet();
   EXPECT_TRUE(console.Contains("Enter an authorized login name and password for"));
   EXPECT_TRUE(console.Contains("tavi-01.lab.example.net."));
   EXPECT_TRUE(console.Contains("Login Name:        [ root "));
@@ -40,7 +38,6 @@ TEST(LoginScreenTest, NamePasswordModeAndEscLeavesNoTrace) {
   console.Type("x");
   console.Key("Esc");
   ASSERT_TRUE(Gone(console, "Authentication Required"));
-  console.WaitQuiet();
   EXPECT_EQ(console.LogLines().size(), logBefore);
   EXPECT_TRUE(RecordsWhere(console, "audit.jsonl", "event", "tulk.login").empty());
   EXPECT_FALSE(console.Cursor().visible);
@@ -56,7 +53,7 @@ TEST(LoginScreenTest, TypingSendsOnlyTheChangedCells) {
   for (const char* key : {"o", "p", "s"}) {
     const std::size_t before = console.BytesReceived();
     console.Type(key);
-    console.WaitQuiet();
+    ASSERT_TRUE(console.WaitReady());
     EXPECT_LT(console.BytesReceived() - before, 40u) << key;
   }
   EXPECT_TRUE(console.Contains("Login Name:        [ ops "));
@@ -141,7 +138,7 @@ TEST(LoginScreenTest, FailedLoginKeepsTheNameAndCanBeRetried) {
   ASSERT_TRUE(LogIn(console, "root", "wrong"));
   ASSERT_TRUE(Settled(console, "Invalid login or password."));
   console.Key("Esc");  // only Enter closes the message
-  console.WaitQuiet();
+  ASSERT_TRUE(console.WaitReady());
   EXPECT_TRUE(console.Contains("Invalid login or password."));
   console.Key("Enter");
   ASSERT_TRUE(Gone(console, "Invalid login or password."));
@@ -168,9 +165,7 @@ TEST(LoginScreenTest, ExpiredPasswordIsChangedThenLoginAgain) {
   ASSERT_TRUE(Settled(console, "Setting the password will prevent unauthorized access"));
   console.Type(SessionTest::kRootPassword);
   console.Key("Down");
-  ASSERT_TRUE(WaitUntil(
-      console, [&] { return console.Cursor().row == RowOf(console, "New Password:"); },
-      "the new-password field"));
+  ASSERT_TRUE(SessionTest::CursorOn(console, "New Password:"));
   console.Type("fresh-1");
   console.Key("Down");
   console.Type("fresh-1");
@@ -234,8 +229,7 @@ TEST(LoginScreenTest, KeyboardLabelOnALocalConsole) {
   EXPECT_EQ(RowOf(console, "Login Name:"), label + 1);
   EXPECT_EQ(RowOf(console, "Password:"), label + 2);
   console.Key("Tab");
-  ASSERT_TRUE(WaitUntil(
-      console, [&] { return console.Cursor().row == label + 1; }, "the login name"));
+  ASSERT_TRUE(SessionTest::CursorOn(console, "Login Name:"));
   console.Key("Up");
   console.Key("Enter");
   ASSERT_TRUE(Settled(console, "Configure Keyboard"));

@@ -78,7 +78,7 @@ TEST(MenuScreenTest, HostStateGreysEntriesAndSelectionSkipsThem) {
     }
     EXPECT_NE(console.At(RowOf(console, "Network Restore Options"), 3).fg, kDarkGrey);
     console.Key("Down", c.downs);
-    console.WaitQuiet();
+    ASSERT_TRUE(console.WaitReady());
     EXPECT_EQ(RightTitle(console), c.selected) << console.Dump();
   }
 }
@@ -147,16 +147,14 @@ TEST(MenuScreenTest, SupportPagesTurnWithinTheirLimits) {
   EXPECT_TRUE(console.WaitForText("Page one of tavi-01.lab.example.net"));
   EXPECT_FALSE(console.Contains("not shown"));
   console.Key("PageUp");
-  console.WaitQuiet();
-  EXPECT_TRUE(console.WaitForText("Page one"));
+  EXPECT_TRUE(MenuTest::Settled(console, "Page one"));
   console.Key("PageDown", 2);
-  EXPECT_TRUE(console.WaitForText("Page three"));
+  EXPECT_TRUE(MenuTest::Settled(console, "Page three"));
   console.Key("PageDown");
-  console.WaitQuiet();
-  EXPECT_TRUE(console.WaitForText("Page three"));
+  EXPECT_TRUE(MenuTest::Settled(console, "Page three"));
   console.Key("Up");
   console.Key("Down");
-  EXPECT_TRUE(console.WaitForText("Page one"));
+  EXPECT_TRUE(MenuTest::Settled(console, "Page one"));
 }
 
 TEST(MenuScreenTest, SupportPageShowsHostFingerprints) {
@@ -198,12 +196,9 @@ TEST(MenuScreenTest, UnreadableCertificateLeavesTheThumbprintEmpty) {
   EXPECT_TRUE(console.WaitForText("sha256=[]"));
   EXPECT_TRUE(console.WaitForLog("<11>Failed to generate the host's SHA256 SSL thumbprint"));
   // Redraws of the page reuse the value: the unchanged file is not read again.
-  console.WaitQuiet();
   console.Key("Up");
-  console.WaitQuiet();
   console.Key("Down");
-  EXPECT_TRUE(console.WaitForText("sha256=[]"));
-  console.WaitQuiet();
+  EXPECT_TRUE(MenuTest::Settled(console, "sha256=[]"));
   const std::vector<std::string> lines = console.LogLines();
   EXPECT_EQ(std::count(lines.begin(), lines.end(),
                        "<11>Failed to generate the host's SHA256 SSL thumbprint"),
@@ -223,8 +218,7 @@ TEST(MenuScreenTest, AVanishedInterfaceIsReportedOnRestart) {
   EXPECT_TRUE(console.WaitForText("Management network interface cannot be found."));
   EXPECT_TRUE(console.WaitForText("Restart Management Network: Error"));
   console.Key("Esc");
-  console.WaitQuiet();
-  EXPECT_TRUE(console.WaitForText("Management network interface cannot be found."));
+  EXPECT_TRUE(MenuTest::Settled(console, "Management network interface cannot be found."));
   console.Key("Enter");
   EXPECT_TRUE(console.WaitForTextGone("cannot be found"));
 }
@@ -247,7 +241,7 @@ TEST(MenuScreenTest, ReloadSignalReadsTheHostAgainAndKeepsTheSelection) {
 
   EXPECT_TRUE(MenuTest::WaitUntil(
       console, [&] { return console.At(lockdownRow, 3).fg == kDarkGrey; }, "greyed lockdown"));
-  console.WaitQuiet();
+  ASSERT_TRUE(console.WaitReady());
   EXPECT_EQ(console.At(RowOf(console, "Test Management Network"), 3).fg, kDarkGrey);
   EXPECT_EQ(RightTitle(console), "View System Logs");
   console.Key("Up");
@@ -265,9 +259,8 @@ TEST(MenuScreenTest, OneDownFitsASlowSerialLine) {
     const std::size_t before = console.BytesReceived();
     const std::string from = RightTitle(console);
     console.Key("Down");
-    ASSERT_TRUE(MenuTest::WaitUntil(
-        console, [&] { return RightTitle(console) != from; }, "a move"));
-    console.WaitQuiet();
+    ASSERT_TRUE(console.WaitReady());
+    ASSERT_NE(RightTitle(console), from) << console.Dump();
     const std::size_t bytes = console.BytesReceived() - before;
     EXPECT_LT(bytes, step == 0 ? 600U : 1000U) << from << " -> " << RightTitle(console);
   }

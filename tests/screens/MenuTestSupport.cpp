@@ -1,7 +1,6 @@
 #include "MenuTestSupport.h"
 
 #include <cstdio>
-#include <thread>
 
 namespace MenuTest {
 
@@ -23,21 +22,16 @@ std::string RightTitle(const TulkTest::TestConsole& console, int cols) {
 
 ::testing::AssertionResult SelectEntry(TulkTest::TestConsole& console, const std::string& title,
                                        int cols) {
-  Settled(console, "System Customization");
+  if (auto menu = Settled(console, "System Customization"); !menu) {
+    return menu;
+  }
   for (int step = 0; step < 20; ++step) {
-    // Read the title only once the move has been drawn completely: a title
-    // read half-way through an update matches neither entry.
-    console.WaitQuiet(std::chrono::milliseconds(60));
-    const std::string shown = RightTitle(console, cols);
-    if (shown == title) {
-      console.WaitQuiet();
+    if (RightTitle(console, cols) == title) {
       return ::testing::AssertionSuccess();
     }
     console.Key("Down");
-    if (!WaitUntil(
-            console, [&] { return RightTitle(console, cols) != shown; }, "a move",
-            std::chrono::milliseconds(2000))) {
-      break;
+    if (auto ready = console.WaitReady(); !ready) {
+      return ready;
     }
   }
   return ::testing::AssertionFailure() << "no entry " << title << "\n" << console.Dump();

@@ -10,12 +10,12 @@ namespace {
 using nlohmann::json;
 using SessionTest::ConsoleOptions;
 using SessionTest::CountLog;
+using SessionTest::CursorOn;
 using SessionTest::Gone;
 using SessionTest::LogIn;
 using SessionTest::RecordsWhere;
 using SessionTest::RowOf;
 using SessionTest::Settled;
-using SessionTest::WaitUntil;
 using TulkTest::TestConsole;
 
 constexpr char kDialogText[] = "Setting the password will prevent unauthorized access";
@@ -33,15 +33,6 @@ std::string PasswordFile(const TestConsole& console) {
   }
   console.Key("Enter");  // "Configure Password" is the first entry
   return SessionTest::Settled(console, kDialogText);
-}
-
-// Waits for the cursor to stand on the field labelled `label`, then for the
-// redraw that moved it to end.
-::testing::AssertionResult CursorOn(TestConsole& console, const std::string& label) {
-  auto moved = WaitUntil(
-      console, [&] { return console.Cursor().row == RowOf(console, label); }, label);
-  console.WaitQuiet();
-  return moved;
 }
 
 std::vector<json> PasswordAudits(const TestConsole& console) {

@@ -37,15 +37,7 @@ void WriteRootFile(const std::filesystem::path& root, const std::string& path,
 
 ::testing::AssertionResult WaitUntil(TestConsole& console, const std::function<bool()>& condition,
                                      const std::string& what, std::chrono::milliseconds timeout) {
-  const auto deadline = std::chrono::steady_clock::now() + timeout;
-  while (!condition()) {
-    if (std::chrono::steady_clock::now() > deadline) {
-      return ::testing::AssertionFailure() << "timed out waiting for " << what << "\n"
-                                           << console.Dump();
-    }
-    console.Pump(std::chrono::milliseconds(20));
-  }
-  return ::testing::AssertionSuccess();
+  return console.WaitUntil(condition, what, timeout);
 }
 
 std::string ReadText(const std::filesystem::path& path) {
@@ -60,15 +52,31 @@ void ReplaceHostState(const TestConsole& console, const nlohmann::json& host) {
 }
 
 ::testing::AssertionResult Settled(TestConsole& console, const std::string& text) {
-  auto shown = console.WaitForText(text);
-  console.WaitQuiet();
-  return shown;
+  if (auto shown = console.WaitForText(text); !shown) {
+    return shown;
+  }
+  if (auto ready = console.WaitReady(); !ready) {
+    return ready;
+  }
+  if (!console.Contains(text)) {
+    return ::testing::AssertionFailure() << "\"" << text << "\" was shown, then replaced\n"
+                                         << console.Dump();
+  }
+  return ::testing::AssertionSuccess();
 }
 
 ::testing::AssertionResult Gone(TestConsole& console, const std::string& text) {
-  auto gone = console.WaitForTextGone(text);
-  console.WaitQuiet();
-  return gone;
+  if (auto gone = console.WaitForTextGone(text); !gone) {
+    return gone;
+  }
+  if (auto ready = console.WaitReady(); !ready) {
+    return ready;
+  }
+  if (console.Contains(text)) {
+    return ::testing::AssertionFailure() << "\"" << text << "\" went, then came back\n"
+                                         << console.Dump();
+  }
+  return ::testing::AssertionSuccess();
 }
 
 }  // namespace TulkTest

@@ -49,11 +49,11 @@ void ReplaceHostState(const TestConsole& console, const nlohmann::json& host);
 /// the failure names `what` and dumps the screen.
 ::testing::AssertionResult WaitUntil(TestConsole& console, const std::function<bool()>& condition,
                                      const std::string& what,
-                                     std::chrono::milliseconds timeout = std::chrono::seconds(5));
+                                     std::chrono::milliseconds timeout = kWait);
 
-/// Waits for `text` to appear (or, for Gone, to disappear), then until the
-/// console has been quiet for a moment: one update can reach the terminal in
-/// several reads, and what lies below `text` may still be on its way.
+/// Waits for `text` to appear (or, for Gone, to disappear) and for the
+/// console to have handled everything sent to it (TestConsole::WaitReady());
+/// fails when the settled screen no longer (or again) shows `text`.
 ::testing::AssertionResult Settled(TestConsole& console, const std::string& text);
 ::testing::AssertionResult Gone(TestConsole& console, const std::string& text);
 

@@ -3,6 +3,7 @@
 
 #include <signal.h>
 
+#include "ProcessHygiene.h"
 #include "SessionTestSupport.h"
 
 namespace {
@@ -45,9 +46,12 @@ TEST(SessionScreenTest, IdleTimeoutEndsTheSession) {
   TestConsole console(options);
   ASSERT_TRUE(LogIn(console));
   ASSERT_TRUE(Settled(console, "System Customization"));
-  ASSERT_TRUE(console.WaitForLog("User root logged out due to time out", std::chrono::seconds(8)));
-  ASSERT_TRUE(Settled(console, "To manage this host"));
-  EXPECT_FALSE(console.Contains("System Customization"));
+  ASSERT_TRUE(console.WaitForLog("User root logged out due to time out"));
+  ASSERT_TRUE(console.WaitUntil(
+      [&] {
+        return console.Contains("To manage this host") && !console.Contains("System Customization");
+      },
+      "the welcome screen in place of the menu"));
   EXPECT_EQ(CountLog(console, "<14>User root logged out"), 0);
   const auto logouts = RecordsWhere(console, "audit.jsonl", "event", "tulk.logout");
   ASSERT_EQ(logouts.size(), 1u);
@@ -64,13 +68,33 @@ TEST(SessionScreenTest, Sigusr2DuringASessionExitsAfterLogout) {
   ASSERT_TRUE(Settled(console, "System Customization"));
   console.Signal(SIGUSR2);
   console.Key("Down");
-  console.WaitQuiet();
+  ASSERT_TRUE(console.WaitReady());
   EXPECT_TRUE(console.Running());
   EXPECT_TRUE(console.Contains("System Customization"));
   console.Key("Esc");
   EXPECT_EQ(console.WaitExit(), 0);
   EXPECT_EQ(CountLog(console, "<14>User root logged out"), 1);
   EXPECT_EQ(RecordsWhere(console, "audit.jsonl", "event", "tulk.logout").size(), 1u);
+}
+
+}  // namespace
+
+namespace {
+
+TEST(SessionScreenTest, KilledConsoleLeavesNoPamFolderBehind) {
+  std::string marker;
+  {
+    TestConsole console(ConsoleOptions());
+    ASSERT_TRUE(LogIn(console));
+    ASSERT_TRUE(Settled(console, "System Customization"));
+    marker = console.Root().parent_path().string() + "/";
+    ASSERT_EQ(TulkTest::PamFoldersOf(marker).size(), 1u);
+    console.Signal(SIGKILL);
+    ASSERT_EQ(console.WaitExit(), 128 + SIGKILL);
+    // Killed, pam_wrapper could not remove its folder itself.
+    EXPECT_EQ(TulkTest::PamFoldersOf(marker).size(), 1u);
+  }
+  EXPECT_TRUE(TulkTest::PamFoldersOf(marker).empty());
 }
 
 }  // namespace

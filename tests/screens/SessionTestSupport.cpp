@@ -1,7 +1,6 @@
 #include "SessionTestSupport.h"
 
 #include <algorithm>
-#include <thread>
 
 namespace SessionTest {
 
@@ -69,6 +68,18 @@ std::vector<std::string> CommandLines(const TulkTest::TestConsole& console) {
 int CountLog(const TulkTest::TestConsole& console, const std::string& line) {
   const std::vector<std::string> lines = console.LogLines();
   return static_cast<int>(std::count(lines.begin(), lines.end(), line));
+}
+
+::testing::AssertionResult CursorOn(TulkTest::TestConsole& console, const std::string& label) {
+  if (auto ready = console.WaitReady(); !ready) {
+    return ready;
+  }
+  const int row = RowOf(console, label);
+  if (row < 0 || console.Cursor().row != row) {
+    return ::testing::AssertionFailure() << "the cursor is not on \"" << label << "\"\n"
+                                         << console.Dump();
+  }
+  return ::testing::AssertionSuccess();
 }
 
 int RowOf(const TulkTest::TestConsole& console, const std::string& text, int rows) {

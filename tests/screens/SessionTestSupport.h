@@ -74,6 +74,10 @@ int CountLog(const TulkTest::TestConsole& console, const std::string& line);
 /// one cell).
 std::string Cells(const TulkTest::TestConsole& console, int row, int column, int count);
 
+/// Waits until the console has handled the keys sent, then checks that the
+/// cursor stands on the row of the field labelled `label`.
+::testing::AssertionResult CursorOn(TulkTest::TestConsole& console, const std::string& label);
+
 /// The first screen row (of `rows`) holding `text`, or -1.
 int RowOf(const TulkTest::TestConsole& console, const std::string& text, int rows = 25);
 

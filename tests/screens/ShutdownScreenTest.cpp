@@ -51,7 +51,6 @@ TEST(ShutdownScreenTest, EscLeavesWithoutRunningAnything) {
   console.Key("Enter");
   console.Key("Esc");
   ASSERT_TRUE(Settled(console, "To manage this host"));
-  console.WaitQuiet();
   EXPECT_EQ(CountRuns(console, "powerOffVms") + CountRuns(console, "poweroff") +
                 CountRuns(console, "reboot"),
             0);
@@ -78,7 +77,7 @@ TEST(ShutdownScreenTest, ShutDownKeepsMachinesGracefulUnlessTicked) {
   // The console waits for the host to go down and ignores keys meanwhile.
   console.Key("Esc");
   console.Key("Enter");
-  console.WaitQuiet();
+  ASSERT_TRUE(console.WaitReady());
   EXPECT_TRUE(console.Contains("Shutdown in progress..."));
   EXPECT_TRUE(console.Running());
 }
@@ -128,7 +127,7 @@ TEST(ShutdownScreenTest, RestartCommandThatFailsKeepsWaiting) {
   ASSERT_TRUE(WaitUntil(
       console, [&] { return Ran(console, "reboot"); }, "reboot"));
   console.Key("Esc");
-  console.WaitQuiet();
+  ASSERT_TRUE(console.WaitReady());
   EXPECT_TRUE(console.Contains("Restart in progress..."));
   EXPECT_EQ(Power(console), "on");
 }

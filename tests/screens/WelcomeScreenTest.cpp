@@ -13,7 +13,6 @@ using nlohmann::json;
 using SessionTest::ConsoleOptions;
 using SessionTest::Gone;
 using SessionTest::Settled;
-using SessionTest::WaitUntil;
 using TulkTest::DemoHostState;
 using TulkTest::TestConsole;
 
@@ -44,7 +43,6 @@ std::vector<json> Ipv6Networks(int count) {
 TEST(WelcomeScreenTest, ShowsTheDemoHostInTwoPanels) {
   TestConsole console(ConsoleOptions());
   ASSERT_TRUE(Settled(console, "To manage this host, go to:"));
-  console.WaitQuiet();
 
   EXPECT_EQ(SessionTest::Cells(console, kVersionRow, 8, 27), "Brimlo Tavi 8.1.0 (HyKernel");
   EXPECT_EQ(SessionTest::Cells(console, kHardwareRow, 8, 36),
@@ -80,23 +78,20 @@ TEST(WelcomeScreenTest, ShowsTheDemoHostInTwoPanels) {
 TEST(WelcomeScreenTest, F4TogglesMonochromeAndOtherKeysRepaint) {
   TestConsole console(ConsoleOptions());
   ASSERT_TRUE(Settled(console, "To manage this host"));
-  console.WaitQuiet();
   console.Key("F4");
-  ASSERT_TRUE(WaitUntil(
-      console, [&] { return console.At(3, 40).reverse; }, "standout panel"));
-  console.WaitQuiet();
+  ASSERT_TRUE(console.WaitReady());
+  EXPECT_TRUE(console.At(3, 40).reverse) << console.Dump();
   EXPECT_FALSE(console.At(18, 40).reverse);
   EXPECT_NE(console.At(18, 40).bg, Tulk::kYellow);
 
   console.Key("F4");
-  ASSERT_TRUE(WaitUntil(
-      console, [&] { return console.At(18, 40).bg == Tulk::kYellow; }, "colours"));
-  console.WaitQuiet();
+  ASSERT_TRUE(console.WaitReady());
+  EXPECT_EQ(console.At(18, 40).bg, Tulk::kYellow) << console.Dump();
   EXPECT_FALSE(console.At(3, 40).reverse);
 
   const std::size_t before = console.BytesReceived();
   console.Type("x");
-  console.WaitQuiet();
+  ASSERT_TRUE(console.WaitReady());
   // A full repaint: every cell is sent again.
   EXPECT_GT(console.BytesReceived() - before, 80u * 20u);
   EXPECT_TRUE(console.Contains("https://10.20.30.41/ (STATIC)"));
@@ -123,7 +118,6 @@ TEST(WelcomeScreenTest, FiveIpv6AddressesAreAllListedSixAreCut) {
     ManagementNic(host)["ipv6"]["networks"] = Ipv6Networks(count);
     TestConsole console(ConsoleOptions(host));
     ASSERT_TRUE(Settled(console, "https://[2001:db8:0:4::1]/ (STATIC)")) << count;
-    console.WaitQuiet();
     EXPECT_EQ(SessionTest::Cells(console, kAddressRow + 1, 8, 30), "https://[2001:db8:0:1::1]/ (ST")
         << "no host name or IPv4 line for localhost without IPv4";
     EXPECT_EQ(console.Contains("https://[2001:db8:0:5::1]/"), count == 5) << count;
@@ -138,7 +132,6 @@ TEST(WelcomeScreenTest, DhcpWithoutLeaseWaitsAndWarns) {
   ManagementNic(host)["dhcpLease"] = nullptr;
   TestConsole console(ConsoleOptions(host));
   ASSERT_TRUE(Settled(console, "https://0.0.0.0/ (Waiting for DHCP...)"));
-  console.WaitQuiet();
   EXPECT_EQ(SessionTest::Cells(console, kWarningRow, 16, 28), "Warning: DHCP lookup failed.");
   EXPECT_EQ(console.At(kWarningRow, 16).fg, Tulk::kDarkGrey);
 }
@@ -160,7 +153,7 @@ TEST(WelcomeScreenTest, NoPhysicalNicRaisesTheAlertOnce) {
   EXPECT_FALSE(console.Contains("To manage this host"));
   console.Type("x");
   console.Key("F4");
-  console.WaitQuiet();
+  ASSERT_TRUE(console.WaitReady());
   const json alerts = TulkTest::ReadHostState(console.HostStatePath())["system"]["alerts"];
   EXPECT_EQ(alerts, json::array({"No compatible network adapter found."}));
 }
@@ -170,7 +163,6 @@ TEST(WelcomeScreenTest, CustomMessageAndBackOnReload) {
   host["system"]["welcomeMessage"] = "Lab host of team {color:red}Blue{/color}\nCall 1234";
   TestConsole console(ConsoleOptions(host));
   ASSERT_TRUE(Settled(console, "Lab host of team Blue"));
-  console.WaitQuiet();
   EXPECT_EQ(SessionTest::Cells(console, 2, 0, 24), "│ Lab host of team Blue ");
   EXPECT_EQ(console.At(2, 19).fg, Tulk::kRed);
   EXPECT_EQ(SessionTest::Cells(console, 3, 2, 9), "Call 1234");

@@ -80,11 +80,8 @@ inline int ForegroundOf(const TestConsole& console, const std::string& text) {
 inline ::testing::AssertionResult SelectTitle(TestConsole& console, const std::string& title,
                                               int moves = 5) {
   for (int step = 0; step < moves && console.Row(1).find(title) == std::string::npos; ++step) {
-    const std::string shown = console.Row(1);
     console.Key("Down");
-    TulkTest::WaitUntil(
-        console, [&] { return console.Row(1) != shown; }, "a move");
-    console.WaitQuiet(std::chrono::milliseconds(60));  // a move may arrive in pieces
+    console.WaitReady();
   }
   if (console.Row(1).find(title) == std::string::npos) {
     return ::testing::AssertionFailure() << "no entry " << title << "\n" << console.Dump();

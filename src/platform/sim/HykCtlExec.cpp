@@ -21,7 +21,7 @@ extern char** environ;
 namespace HykCtl::Util {
 namespace {
 
-constexpr std::size_t kCaptureLimit = 64 * 1024;
+constexpr std::size_t kCaptureLimit = std::size_t{64} * 1024;
 
 bool IsExecutable(const std::string& path) {
   struct stat info {};
@@ -51,7 +51,7 @@ std::string Resolve(const std::string& program, const std::string& searchPath) {
     if (end == std::string::npos) {
       end = searchPath.size();
     }
-    const std::string candidate = searchPath.substr(start, end - start) + "/" + program;
+    std::string candidate = searchPath.substr(start, end - start) + "/" + program;
     if (end > start && IsExecutable(candidate)) {
       return candidate;
     }
@@ -130,11 +130,13 @@ ExecResult HykCtl_Exec(const std::string& commandLine, bool captureOutput, bool 
   }
   environment.push_back("PATH=" + searchPath);
   std::vector<char*> argv;
+  argv.reserve(arguments.size() + 1);
   for (std::string& argument : arguments) {
     argv.push_back(argument.data());
   }
   argv.push_back(nullptr);
   std::vector<char*> envp;
+  envp.reserve(environment.size() + 1);
   for (std::string& entry : environment) {
     envp.push_back(entry.data());
   }

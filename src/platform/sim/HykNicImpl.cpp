@@ -5,6 +5,7 @@
 
 namespace HykCtl::Network {
 
+// NOLINTNEXTLINE(bugprone-exception-escape): json's own moves and destructor do not throw
 struct HykNicImpl::Snapshot {
   Sim::json nic;
   std::uint64_t generation = 0;

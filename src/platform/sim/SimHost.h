@@ -98,6 +98,7 @@ class SimHost {
   bool FileChanged() const;
   void EnsureLoaded();
 
+  // NOLINTNEXTLINE(bugprone-exception-escape): json's own moves and destructor do not throw
   struct Snapshot {
     nlohmann::json state;
     std::uint64_t generation = 0;

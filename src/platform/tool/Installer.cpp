@@ -63,7 +63,7 @@ std::string Link(const std::string& target, const std::string& path) {
 
 std::string FindProgram(const std::string& name) {
   for (const char* folder : {"/usr/local/bin", "/usr/bin", "/bin", "/usr/sbin", "/sbin"}) {
-    const std::string candidate = std::string(folder) + "/" + name;
+    std::string candidate = std::string(folder) + "/" + name;
     if (access(candidate.c_str(), X_OK) == 0) {
       return candidate;
     }
