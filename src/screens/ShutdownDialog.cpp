@@ -7,6 +7,7 @@
 
 #include "host/EventReporter.h"
 #include "include/Keys.h"
+#include "render/TextId.h"
 #include "runtime/SystemLog.h"
 #include "screens/PowerConfirmDialog.h"
 #include "toolkit/ItemList.h"
@@ -23,15 +24,35 @@ constexpr char kFooter[] =
     "{color:dark-grey}Restart{/color}{align:right}{color:black}<Esc>{/color} "
     "{color:dark-grey}Cancel{/color}{/align}";
 
+bool Required(ShutdownReason reason) {
+  return reason != ShutdownReason::kOperator;
+}
+
 }  // namespace
 
-ShutdownDialog::ShutdownDialog(Frame* owner)
-    : Dialog(owner, 60, 19, 13), terminate_(Text(kTerminateCaption), false, 0) {
+ShutdownDialog::ShutdownDialog(Frame* owner, ShutdownReason reason)
+    : Dialog(owner, 60, Required(reason) ? 12 : 19, Required(reason) ? 6 : 13),
+      reason_(reason),
+      terminate_(Text(kTerminateCaption), false, 0) {
   list_ = new ItemList(Content(), 0, 0, Content()->Width(), Content()->Height());
   list_->SetItems({&terminate_});
-  SetTitle(Text(kTitle));
-  SetText(Text(kMessage));
-  SetFooter(kFooter);
+  switch (reason_) {
+    case ShutdownReason::kOperator:
+      SetTitle(Text(kTitle));
+      SetText(Text(kMessage));
+      SetFooter(kFooter);
+      break;
+    case ShutdownReason::kIpv6Enabled:
+      SetTitle(Text(TextId::kEnableIpv6RestartTitle));
+      SetText(Text(TextId::kEnableIpv6RestartText));
+      SetFooter(Footer::kRestartNowLater);
+      break;
+    case ShutdownReason::kIpv6Disabled:
+      SetTitle(Text(TextId::kDisableIpv6RestartTitle));
+      SetText(Text(TextId::kDisableIpv6RestartText));
+      SetFooter(Footer::kRestartNowLater);
+      break;
+  }
 }
 
 int ShutdownDialog::Run() {
@@ -41,7 +62,7 @@ int ShutdownDialog::Run() {
     if (key == kKeySpace) {
       terminate_.Toggle();
       list_->Draw();
-    } else if (key == KEY_F(2)) {
+    } else if (key == KEY_F(2) && !Required(reason_)) {
       PowerAction(false);
     } else if (key == KEY_F(11)) {
       PowerAction(true);

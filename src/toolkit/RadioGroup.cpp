@@ -9,6 +9,16 @@ void RadioGroup::Add(RadioItem* radio, std::vector<Item*> dependents) {
   SelectIndex(selected_);
 }
 
+void RadioGroup::SetDependents(const Item* radio, std::vector<Item*> dependents) {
+  for (Member& member : members_) {
+    if (member.radio == radio) {
+      member.dependents = std::move(dependents);
+      ApplyRule();
+      return;
+    }
+  }
+}
+
 void RadioGroup::Select(const Item* radio) {
   for (std::size_t i = 0; i < members_.size(); ++i) {
     if (members_[i].radio == radio) {
