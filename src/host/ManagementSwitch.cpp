@@ -70,13 +70,10 @@ NicTeamingPolicy WithoutUplink(NicTeamingPolicy policy, const std::string& pnic,
   return policy;
 }
 
-// Takes `pnic` off the other switch `owner` and onto `target`.
-void MoveFromOtherSwitch(const std::string& pnic, const std::string& owner,
-                         const std::string& target) {
+// Lowers the teaming policy of standard switch `owner` that `pnic` has left.
+void ShrinkPolicyOf(const std::string& owner, const std::string& pnic) {
   PortsetImpl source(owner);
-  const bool standard = source.GetType() == PortsetImpl::kStandard;
-  source.MoveUplink(pnic, target);
-  if (standard) {
+  if (source.GetType() == PortsetImpl::kStandard) {
     const int remaining = static_cast<int>(source.GetUplinks().size());
     source.SetTeamingPolicy(WithoutUplink(source.GetTeamingPolicy(), pnic, remaining));
   }
@@ -169,16 +166,24 @@ bool AddMgmtUplink(const std::string& nic, const std::string& pnic) {
     return false;
   }
   const std::string& target = attachment->switchName;
+  std::string owner;
   try {
-    const std::string owner = OwnerOf(pnic);
+    owner = OwnerOf(pnic);
     if (!owner.empty() && owner != target) {
-      MoveFromOtherSwitch(pnic, owner, target);
+      PortsetImpl(owner).MoveUplink(pnic, target);
     } else {
       PortsetImpl(target).AddUplink(pnic);
     }
   } catch (const HostMgrException& failure) {
     Log(LOG_ERR, "Adding uplink %s failed: %s", pnic.c_str(), failure.what());
     return false;
+  }
+  if (!owner.empty() && owner != target) {
+    try {
+      ShrinkPolicyOf(owner, pnic);
+    } catch (const HostMgrException& failure) {
+      Log(LOG_ERR, "VS: remove uplink from teaming policy failed: %s", failure.what());
+    }
   }
   try {
     PortsetImpl portset(target);

@@ -34,7 +34,8 @@
 ///   that switch to the management switch in one step
 ///   (PortsetImpl::MoveUplink, which also takes it out of the other
 ///   switch's uplink order); a standard switch it leaves has its maximum
-///   number of active uplinks lowered as for a removal.
+///   number of active uplinks lowered as for a removal (a failure there is
+///   logged with the removal's teaming line and the addition goes on).
 /// - Removing lowers the maximum by one, but never below one while uplinks
 ///   remain and never above the uplinks that remain: taking away a standby
 ///   adapter must not leave the switch without an active one.

@@ -35,7 +35,7 @@ std::string LabelWithMac(const PnicRow& pnic) {
 
 AdaptersDialog::AdaptersDialog(Frame* owner, std::vector<std::string> selected,
                                std::string managementSwitch)
-    : FormDialog(owner, 70, 20, 6),
+    : FormDialog(owner, 70, 20, 7),
       selected_(std::move(selected)),
       managementSwitch_(std::move(managementSwitch)) {
   SetTitle(Text(TextId::kAdaptersTitle));

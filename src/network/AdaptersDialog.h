@@ -2,7 +2,7 @@
 /// "Network Adapters": which physical NICs carry the management network,
 /// in which order.
 ///
-/// A form 70 x 20 with a header of 6 rows: the text "Select the adapters
+/// A form 70 x 20 with a header of 7 rows: the text "Select the adapters
 /// for this host's default management network connection. ...", a heading
 /// row "Device Name", "Hardware Label (MAC Address)", "Status", then one
 /// check box per physical NIC (its name, its hardware label with its MAC

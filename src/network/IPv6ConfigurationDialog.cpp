@@ -22,7 +22,7 @@ constexpr int kCheckIndent = 4;
 
 IPv6ConfigurationDialog::IPv6ConfigurationDialog(Frame* owner, bool enabled,
                                                  const HostMgr::Network::IpConfig& ip)
-    : FormDialog(owner, 70, 19, 7),
+    : FormDialog(owner, 70, 20, 8),
       enabled_(enabled),
       dhcpv6_(ip.GetDhcpv6()),
       routerAdvertisement_(ip.GetRouterAdvertisement() && !ip.GetDhcpv6()),

@@ -3,7 +3,7 @@
 /// host), automatic configuration by router advertisement or DHCPv6, or up
 /// to three static addresses and a default gateway.
 ///
-/// A form 70 x 19 with a header of 7 rows. Items, in order: the check box
+/// A form 70 x 20 with a header of 8 rows. Items, in order: the check box
 /// "Disable IPv6 (restart required)"; the radio "Use dynamic IPv6 address
 /// and network configuration"; the check box "Use DHCPv6" (indented); the
 /// radio "Set static IPv6 address and network configuration"; three inputs
