@@ -118,7 +118,9 @@ void ApplyNetworkChanges::Ipv4() {
 
 void ApplyNetworkChanges::Ipv6() {
   if (pending_.ipv6Enabled != entry_.ipv6Enabled) {
-    if (NetworkWrite write = WriteKernelIpv6Enabled(pending_.ipv6Enabled); !write) {
+    if (NetworkWrite write = WriteKernelIpv6Enabled(pending_.ipv6Enabled); write) {
+      ipv6FlagWritten_ = true;
+    } else {
       LogFailure("Setting ipv6 configuration failed: ", write);
       if (showIpv6Error_) {
         showIpv6Error_("Setting ipv6 configuration failed: " + write.error);

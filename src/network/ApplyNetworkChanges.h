@@ -92,8 +92,10 @@ class ApplyNetworkChanges {
   /// Steps 1 to 13.
   void Run();
 
-  /// The IPv6 flag changed: the host must restart before it takes effect.
-  bool RestartRequired() const { return pending_.ipv6Enabled != entry_.ipv6Enabled; }
+  /// After Run(): the kernel's IPv6 flag was changed, and the host must
+  /// restart before the change takes effect (false when writing the flag
+  /// failed: a restart would change nothing).
+  bool RestartRequired() const { return ipv6FlagWritten_; }
 
  private:
   void Adapters();
@@ -118,6 +120,7 @@ class ApplyNetworkChanges {
   bool haveCurrent_ = false;
   bool ipv4Switched_ = false;
   bool vlanChanged_ = false;
+  bool ipv6FlagWritten_ = false;
 };
 
 }  // namespace Tulk

@@ -31,7 +31,8 @@ bool Required(ShutdownReason reason) {
 }  // namespace
 
 ShutdownDialog::ShutdownDialog(Frame* owner, ShutdownReason reason)
-    : Dialog(owner, 60, Required(reason) ? 12 : 19, Required(reason) ? 6 : 13),
+    : Dialog(owner, Required(reason) ? 70 : 60, Required(reason) ? 11 : 19,
+             Required(reason) ? 5 : 13),
       reason_(reason),
       terminate_(Text(kTerminateCaption), false, 0) {
   list_ = new ItemList(Content(), 0, 0, Content()->Width(), Content()->Height());

@@ -15,7 +15,7 @@
 ///
 /// A required restart: after the management network's IPv6 flag was
 /// changed, the same dialog asks for the restart that the change needs. It
-/// is 60 x 12 with a header of 6 rows: title "Enable IPv6: Restart
+/// is 70 x 11 with a header of 5 rows: title "Enable IPv6: Restart
 /// Required" with "This host must be restarted before IPv6 will be
 /// enabled." (or the "Disable IPv6" pair), the same check box, and the
 /// footer "<F11> Restart Now ... <Esc> Restart Later". F11 restarts exactly

@@ -49,6 +49,7 @@ class ApplyNetworkChangesTest : public ::testing::Test {
     ApplyNetworkChanges apply(entry, pending,
                               [this](const std::string& message) { errors_.push_back(message); });
     apply.Run();
+    restart_ = apply.RestartRequired();
     return HostTest::LogLines();
   }
 
@@ -57,6 +58,7 @@ class ApplyNetworkChangesTest : public ::testing::Test {
 
   json state_;
   Lines errors_;
+  bool restart_ = false;
 };
 
 // Every kind of change of the window's six entries at once.
@@ -235,17 +237,30 @@ TEST_F(ApplyNetworkChangesTest, HostNamesAndNameServers) {
 }
 
 TEST_F(ApplyNetworkChangesTest, TheIpv6FlagWaitsForTheNextBoot) {
-  const ManagementSettings entry = Read();
-  ManagementSettings pending = entry;
-  pending.ipv6Enabled = false;
-  ApplyNetworkChanges apply(entry, pending, nullptr);
-  EXPECT_TRUE(apply.RestartRequired());
-  const Lines lines = Apply(entry, pending);
-  EXPECT_EQ(std::count(lines.begin(), lines.end(), "<14>Setting ipv6 configuration"), 0);
-  const json network = Host()["network"];
-  EXPECT_EQ(network["ipv6EnabledNextBoot"], false);
-  EXPECT_EQ(network["ipv6Enabled"], true);
-  EXPECT_FALSE(ApplyNetworkChanges(entry, entry, nullptr).RestartRequired());
+  struct Case {
+    bool change;
+    json faults;
+    bool restart;
+  };
+  const Case cases[] = {
+      {true, json::object(), true},
+      {false, json::object(), false},
+      // Nothing to restart for when the flag could not be written.
+      {true, {{"NetworkInfoImpl::SetHykIpv6Enabled", "x"}}, false},
+  };
+  for (const Case& c : cases) {
+    SetUp();
+    const ManagementSettings entry = Read();
+    ManagementSettings pending = entry;
+    pending.ipv6Enabled = !c.change;
+    const Lines lines = Apply(entry, pending, c.faults);
+    EXPECT_EQ(restart_, c.restart) << c.change << c.faults;
+    EXPECT_EQ(std::count(lines.begin(), lines.end(), "<14>Setting ipv6 configuration"),
+              c.change ? 0 : 1);
+    const json network = Host()["network"];
+    EXPECT_EQ(network["ipv6Enabled"], true);  // until the next boot
+    EXPECT_EQ(network.value("ipv6EnabledNextBoot", true), !c.restart);
+  }
 }
 
 TEST_F(ApplyNetworkChangesTest, DistributedSwitchSkipsAdaptersAndVlan) {
