@@ -214,26 +214,6 @@ TEST(NetworkChangesTest, OnlyWhatTheApplyWouldWriteCounts) {
   EXPECT_FALSE(SettingsDiffer(automatic, retyped));
 }
 
-TEST(NetworkChangesTest, DnsFromDhcpOnlyWithAnAutomaticIpConfiguration) {
-  struct Case {
-    bool dhcp;
-    bool dhcpv6;
-    bool ipv6Enabled;
-    bool allowed;
-  };
-  const Case cases[] = {
-      {true, false, false, true},  {false, true, true, true}, {false, true, false, false},
-      {false, false, true, false}, {true, true, false, true},
-  };
-  for (const Case& c : cases) {
-    HostMgr::Network::IpConfig ip;
-    ip.SetDhcp(c.dhcp);
-    ip.SetDhcpv6(c.dhcpv6);
-    EXPECT_EQ(DnsFromDhcpAllowed(ip, c.ipv6Enabled), c.allowed)
-        << c.dhcp << c.dhcpv6 << c.ipv6Enabled;
-  }
-}
-
 TEST(AdapterRowsTest, LongLabelsAreCutSoThatTheMacStaysWhole) {
   PnicRow pnic{"hynic0", "Kestrel Networks KN-X540 10GbE SFP+ Adapter", "02:6b:4e:10:20:01",
                "Connected", "vSwitch0"};
