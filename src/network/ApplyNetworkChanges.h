@@ -71,6 +71,14 @@
 ///   later apply of other settings.
 /// - The IPv6 gateway counts as changed when the pending gateway (with its
 ///   zone) differs from the one read on entry.
+/// - Steps 3 and 4 build one configuration that step 5 hands to the NIC in
+///   a single write; so an IPv4 or IPv6 change that the NIC refuses is
+///   reported by step 5 ("Setting ip/ipv6 configuration failed").
+/// - Like DHCP and static, the "none" line is written only when the NIC's
+///   IPv4 is not already off.
+/// - The failure lines of steps 6 and 9 ("Renew DHCP lease failed: %s",
+///   "Restarting management interface failed: %s") and the uplink order
+///   of step 1 are this sequence's own additions.
 
 #include <functional>
 #include <string>

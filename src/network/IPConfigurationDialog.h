@@ -23,6 +23,12 @@
 ///    gateway address" with its text and puts the cursor in that input;
 /// 4. all valid: address, netmask and gateway are stored.
 /// Esc leaves the pending configuration untouched.
+///
+/// Decisions of this implementation:
+/// - A value of 0.0.0.0 (no address) shows as an empty input, so that a
+///   host without a gateway is asked for one rather than offered 0.0.0.0.
+/// - Choosing DHCP or static on a host whose IPv4 is switched off turns it
+///   back on (the "none" flag is cleared).
 
 #include "platform/api/IpConfig.h"
 #include "toolkit/FormDialog.h"
