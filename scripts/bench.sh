@@ -2,6 +2,8 @@
 # Builds the release configuration and runs every benchmark:
 #   - the whole console in a pseudo-terminal (bench/console): start-up to a
 #     settled screen, peak memory, bytes written per key, idle cost;
+#   - the management network window the same way (bench/network): its draw,
+#     the bytes of each move against the fewest possible, an apply's cost;
 #   - Google Benchmark suites of the renderer, host layer, simulated host and
 #     menu (bench/render, bench/host, bench/platform, bench/screens).
 # Output format: the console benchmark prints "figure median min max unit"
@@ -14,6 +16,8 @@ scripts/build.sh default >/dev/null
 
 echo "== console"
 build/default/bench/console/tulk-console-bench "$@"
+echo "== network"
+build/default/bench/network/tulk-network-bench "$@"
 for suite in build/default/bench/render/* build/default/bench/host/* \
              build/default/bench/platform/* build/default/bench/screens/*; do
   if [[ -f $suite && -x $suite ]]; then

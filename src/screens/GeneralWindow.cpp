@@ -7,6 +7,7 @@
 #include "host/HostTools.h"
 #include "host/ManagementNetwork.h"
 #include "include/ProcessFlags.h"
+#include "network/NetworkWindow.h"
 #include "render/TextId.h"
 #include "screens/ChangePasswordDialog.h"
 #include "screens/KeyboardDialog.h"
@@ -14,6 +15,7 @@
 #include "screens/LogPager.h"
 #include "screens/ManagementNetworkPane.h"
 #include "screens/RestoreDialog.h"
+#include "screens/ShutdownDialog.h"
 #include "screens/SupportPages.h"
 #include "toolkit/Footer.h"
 #include "toolkit/MessageDialog.h"
@@ -185,6 +187,15 @@ bool GeneralWindow::Open(std::uint32_t id) {
         lockdownEnabled_ = OskCmdGetFlag(kLockdownQuery);
       }
       return true;
+    case kEntryManagementNetwork: {
+      NetworkWindow network(this, [](Frame* owner, bool ipv6Enabled) {
+        ShutdownDialog restart(
+            owner, ipv6Enabled ? ShutdownReason::kIpv6Enabled : ShutdownReason::kIpv6Disabled);
+        RunFrame(&restart);
+      });
+      RunFrame(&network);
+      return true;
+    }
     case kEntryRestartNetwork:
       if (!GetManagementInterface()) {
         ShowMessage(this, TextId::kRestartNetworkErrorTitle, TextId::kNoManagementInterface);

@@ -55,6 +55,9 @@
 /// - Entry 8's footer offers "<Enter> Restart", entry 10's "<Enter> More"
 ///   (it opens a window, like entries 7 and 13); entry 11's footer shows
 ///   the page hints "<Page Up> <Page Down>" in light grey on the left.
+/// - Entry 7 opens the management network window (network/NetworkWindow.h)
+///   and hands it the restart question an IPv6 change needs: the shutdown
+///   dialog in its required-restart mode (ShutdownDialog.h).
 /// - After a screen opened with Enter returns, the window is shown again
 ///   with the same entry selected (when that entry is still enabled, else
 ///   the first entry). Enter on entries 11 and 12 does nothing and redraws

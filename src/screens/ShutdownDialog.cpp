@@ -14,16 +14,40 @@
 #include "toolkit/RunFrame.h"
 
 namespace Tulk {
+namespace {
 
-ShutdownDialog::ShutdownDialog(Frame* owner) : FormDialog(owner, 60, 19, 13) {
+bool Required(ShutdownReason reason) {
+  return reason != ShutdownReason::kOperator;
+}
+
+}  // namespace
+
+ShutdownDialog::ShutdownDialog(Frame* owner, ShutdownReason reason)
+    : FormDialog(owner, Required(reason) ? 70 : 60, Required(reason) ? 11 : 19,
+                 Required(reason) ? 5 : 13),
+      reason_(reason) {
   terminate_ = &AddCheck(Text(TextId::kForceTerminateVms));
-  SetTitle(Text(TextId::kShutdownTitle));
-  SetText(Text(TextId::kShutdownText));
-  SetFooter(Footer::kShutdownRestartCancel);
+  switch (reason_) {
+    case ShutdownReason::kOperator:
+      SetTitle(Text(TextId::kShutdownTitle));
+      SetText(Text(TextId::kShutdownText));
+      SetFooter(Footer::kShutdownRestartCancel);
+      break;
+    case ShutdownReason::kIpv6Enabled:
+      SetTitle(Text(TextId::kEnableIpv6RestartTitle));
+      SetText(Text(TextId::kEnableIpv6RestartText));
+      SetFooter(Footer::kRestartNowLater);
+      break;
+    case ShutdownReason::kIpv6Disabled:
+      SetTitle(Text(TextId::kDisableIpv6RestartTitle));
+      SetText(Text(TextId::kDisableIpv6RestartText));
+      SetFooter(Footer::kRestartNowLater);
+      break;
+  }
 }
 
 bool ShutdownDialog::OnKey(int key) {
-  if (key == KEY_F(2) || key == KEY_F(11)) {
+  if ((key == KEY_F(2) && !Required(reason_)) || key == KEY_F(11)) {
     PowerAction(key == KEY_F(11));
     return true;
   }

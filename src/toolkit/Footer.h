@@ -86,6 +86,10 @@ inline constexpr char kPinLogin[] =
 /// blanks.
 inline constexpr char kDetailsOk[] =
     "{align:right}{color:black}<Enter>{/color} {color:dark-grey}OK{/color}{/align}  ";
+/// "<F11> Restart Now ... <Esc> Restart Later": a restart the host needs.
+inline constexpr char kRestartNowLater[] =
+    "{color:black}<F11>{/color} {color:dark-grey}Restart Now{/color}"
+    "{align:right}{color:black}<Esc>{/color} {color:dark-grey}Restart Later{/color}{/align}";
 
 // Full-screen menus.
 /// The left footer of every menu.

@@ -159,7 +159,9 @@ int MenuWindow::Run() {
     if (key == KEY_DOWN || key == KEY_UP) {
       Move(key == KEY_DOWN);
     } else if (key == kKeyEsc) {
-      return 1;
+      if (Leave()) {
+        return 1;
+      }
     } else if (key == kKeyEnter) {
       const MenuEntry* entry = Selected();
       if (entry != nullptr && entry->enabled && entry->action) {

@@ -10,8 +10,8 @@
 ///
 /// Keys of Run(): Down and Up move and show the new entry's description;
 /// Enter runs the selected entry's action and, when the action asks for it,
-/// shows the window again (Show(): Populate()); Esc returns 1; every other
-/// key goes to OnKey().
+/// shows the window again (Show(): Populate()); Esc returns 1 unless
+/// Leave() keeps the window open; every other key goes to OnKey().
 ///
 ///   class ToolsWindow : public MenuWindow {
 ///    public:
@@ -123,6 +123,9 @@ class MenuWindow : public RootWindow {
   virtual bool OnKey(int key);
   /// Called before the selection moves away from an entry.
   virtual void BeforeMove() {}
+  /// Esc: whether the window closes (a window with unsaved edits may ask
+  /// first); the default closes it.
+  virtual bool Leave() { return true; }
 
  private:
   void Relabel(std::size_t position);

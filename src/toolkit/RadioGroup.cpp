@@ -13,10 +13,10 @@ void RadioGroup::SetDependents(const Item* radio, std::vector<Item*> dependents)
   for (Member& member : members_) {
     if (member.radio == radio) {
       member.dependents = std::move(dependents);
-      break;
+      ApplyRule();
+      return;
     }
   }
-  ApplyRule();
 }
 
 void RadioGroup::Select(const Item* radio) {

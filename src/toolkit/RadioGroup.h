@@ -28,8 +28,9 @@ class RadioGroup {
   /// otherwise.
   void Add(RadioItem* radio, std::vector<Item*> dependents = {});
 
-  /// Makes `dependents` follow `radio` (replacing what followed it before)
-  /// and applies the enabling rule.
+  /// Gives `radio` the items that follow it (replacing any given before)
+  /// and applies the enabling rule: for a form whose dependent inputs are
+  /// added after their button. Ignored when the button is not in the group.
   void SetDependents(const Item* radio, std::vector<Item*> dependents);
 
   /// Marks `radio` alone and applies the enabling rule. Ignored when the
