@@ -20,6 +20,12 @@ using boost::system::error_code;
 // that "/etc/hosts.backup" never holds half a copy.
 constexpr char kHostsBackupPartial[] = "/etc/hosts.backup.partial";
 
+// A missing file is an answer here, not a failure.
+bool Exists(const fs::path& path) {
+  error_code ignored;
+  return fs::exists(fs::symlink_status(path, ignored));
+}
+
 }  // namespace
 
 bool BackUpHostsFile() {
@@ -43,13 +49,10 @@ bool BackUpHostsFile() {
 bool RestoreHostsFile() {
   const fs::path hosts(HostPath(kHostsFile));
   const fs::path backup(HostPath(kHostsBackup));
-  error_code error;
-  if (!fs::exists(backup, error)) {
-    if (error) {
-      Log(LOG_INFO, "failed to restore /etc/hosts: %s", error.message().c_str());
-    }
+  if (!Exists(backup)) {
     return false;
   }
+  error_code error;
   fs::remove(hosts, error);
   if (!error) {
     fs::rename(backup, hosts, error);
@@ -62,11 +65,7 @@ bool RestoreHostsFile() {
 }
 
 bool RecoverHostsFile() {
-  error_code error;
-  if (!fs::exists(fs::path(HostPath(kHostsBackup)), error)) {
-    return false;
-  }
-  if (!RestoreHostsFile()) {
+  if (!Exists(fs::path(HostPath(kHostsBackup))) || !RestoreHostsFile()) {
     return false;
   }
   Log(LOG_WARNING,

@@ -95,7 +95,7 @@ bool NetworkRestoreWindow::Open(std::uint32_t id) {
       }
       return false;
     case TextId::kRestoreDvs:
-      RunDialog<RestoreDVSDialog>(this);
+      RunRestoreDvs(this);
       return true;
     default:
       return false;

@@ -3,6 +3,8 @@
 #include <curses.h>
 
 #include <algorithm>
+#include <optional>
+#include <utility>
 
 #include "host/SwitchSummary.h"
 #include "host/VlanInput.h"
@@ -18,21 +20,16 @@
 
 namespace Tulk {
 
-RestoreDVSDialog::RestoreDVSDialog(Frame* owner)
-    : FormDialog(owner, kWidth, kHeight, kHeaderHeight), port_(ReadManagementDvsPort()) {
+RestoreDVSDialog::RestoreDVSDialog(Frame* owner, ManagementDvsPort port)
+    : FormDialog(owner, kWidth, kHeight, kHeaderHeight), port_(std::move(port)) {
   SetTitle(Text(TextId::kRestoreDvsTitle));
   SetText(Text(TextId::kRestoreDvsText));
   SetFooter(Footer::kSelectToggleOkCancel);
-  std::string vlan;
-  if (port_) {
-    if (port_->vlanId != 0) {
-      vlan = std::to_string(port_->vlanId);
-    }
-    for (const std::string& uplink : port_->switchUplinks) {
-      if (std::find(port_->portUplinks.begin(), port_->portUplinks.end(), uplink) !=
-          port_->portUplinks.end()) {
-        chosen_.push_back(uplink);
-      }
+  const std::string vlan = port_.vlanId != 0 ? std::to_string(port_.vlanId) : "";
+  for (const std::string& uplink : port_.switchUplinks) {
+    if (std::find(port_.portUplinks.begin(), port_.portUplinks.end(), uplink) !=
+        port_.portUplinks.end()) {
+      chosen_.push_back(uplink);
     }
   }
   vlan_ = &AddInput(Text(TextId::kVlanOptional), vlan, 5, kDigits, 4);
@@ -46,27 +43,11 @@ void RestoreDVSDialog::ShowChosen() {
   shown_->SetText(std::string(Text(TextId::kDvsUplinksTitle)) + ": " + JoinNames(chosen_));
 }
 
-int RestoreDVSDialog::Run() {
-  if (!port_) {
-    MessageDialog::Show(this, TextId::kRestoreDvsErrorTitle, Text(TextId::kRestoreDvsFailed));
-    return 0;
-  }
-  if (port_->thirdParty) {
-    MessageDialog::Show(this, TextId::kRestoreDvsErrorTitle, Text(TextId::kRestoreDvsThirdParty));
-    return 0;
-  }
-  if (port_->switchUplinks.empty()) {
-    MessageDialog::Show(this, TextId::kNoDvsUplinksTitle, Text(TextId::kNoDvsUplinks));
-    return 0;
-  }
-  return FormDialog::Run();
-}
-
 bool RestoreDVSDialog::OnKey(int key) {
   if (Current() != select_ || (key != kKeyEnter && key != kKeySpace)) {
     return false;
   }
-  DvsUplinksDialog choice(this, port_->switchUplinks, chosen_);
+  DvsUplinksDialog choice(this, port_.switchUplinks, chosen_);
   if (RunFrame(&choice) == 1) {
     chosen_ = choice.Chosen();
     ShowChosen();
@@ -91,6 +72,26 @@ bool RestoreDVSDialog::Accept() {
   MessageDialog::Show(this, TextId::kOperationSucceeded,
                       "The management network now uses a new DVS host local port.");
   return true;
+}
+
+int RunRestoreDvs(Frame* owner) {
+  std::optional<ManagementDvsPort> port = ReadManagementDvsPort();
+  if (!port) {
+    MessageDialog::Show(owner, TextId::kRestoreDvsErrorTitle,
+                        owner->Text(TextId::kRestoreDvsFailed));
+    return 0;
+  }
+  if (port->thirdParty) {
+    MessageDialog::Show(owner, TextId::kRestoreDvsErrorTitle,
+                        owner->Text(TextId::kRestoreDvsThirdParty));
+    return 0;
+  }
+  if (port->switchUplinks.empty()) {
+    MessageDialog::Show(owner, TextId::kNoDvsUplinksTitle, owner->Text(TextId::kNoDvsUplinks));
+    return 0;
+  }
+  RestoreDVSDialog dialog(owner, std::move(*port));
+  return RunFrame(&dialog);
 }
 
 }  // namespace Tulk

@@ -4,8 +4,8 @@
 /// the VLAN and uplinks entered here (every other property is copied), and
 /// the management NIC is moved onto it (RepairManagementDvsPort()).
 ///
-/// Before the form, the management NIC's port is read; the dialog shows a
-/// message and returns 0 instead of the form when
+/// RunRestoreDvs() first reads the management NIC's port, and shows a
+/// message instead of the form when
 /// - the port cannot be read (no management NIC, not on a distributed
 ///   switch, a host failure): "Restore DVS: Error" / "Unable to restore
 ///   DVS. Check logs for details.";
@@ -35,7 +35,6 @@
 /// - The repair needs no separate F11 confirmation: the form itself is the
 ///   operator's deliberate choice of the new port's settings.
 
-#include <optional>
 #include <string>
 #include <vector>
 
@@ -50,12 +49,9 @@ class RestoreDVSDialog : public FormDialog {
   static constexpr int kHeight = 15;
   static constexpr int kHeaderHeight = 7;
 
-  /// Reads the management NIC's port and builds the form above `owner`
-  /// (the restore menu).
-  explicit RestoreDVSDialog(Frame* owner);
-
-  /// The message, or the form; 1 when the port was repaired.
-  int Run() override;
+  /// The form above `owner` (the restore menu) for the management NIC's
+  /// port `port`, which the host can repair (see RunRestoreDvs()).
+  RestoreDVSDialog(Frame* owner, ManagementDvsPort port);
 
  protected:
   bool OnKey(int key) override;
@@ -64,12 +60,17 @@ class RestoreDVSDialog : public FormDialog {
  private:
   void ShowChosen();
 
-  std::optional<ManagementDvsPort> port_;
+  ManagementDvsPort port_;
   std::vector<std::string> chosen_;
   InputItem* vlan_ = nullptr;
   CheckItem* unblock_ = nullptr;
   LabelItem* select_ = nullptr;
   LabelItem* shown_ = nullptr;
 };
+
+/// "Restore DVS" from the restore menu: reads the management NIC's port
+/// and runs the message that says why it cannot be repaired, or the form.
+/// Returns 1 when the port was repaired.
+int RunRestoreDvs(Frame* owner);
 
 }  // namespace Tulk

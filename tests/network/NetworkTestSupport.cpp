@@ -65,6 +65,24 @@ std::string Cells(const TulkTest::TestConsole& console, int row, int column, int
   return text.substr(0, text.find_last_not_of(' ') + 1);
 }
 
+std::string Squeezed(const std::string& text) {
+  std::string squeezed;
+  for (char c : text) {
+    if (c != ' ' || (!squeezed.empty() && squeezed.back() != ' ')) {
+      squeezed += c;
+    }
+  }
+  return squeezed.substr(0, squeezed.find_last_not_of(' ') + 1);
+}
+
+std::string RightText(const TulkTest::TestConsole& console) {
+  std::string text;
+  for (int row = 4; row <= 21; ++row) {
+    text += Cells(console, row, 42, 37) + " ";
+  }
+  return Squeezed(text);
+}
+
 std::string RightTitle(const TulkTest::TestConsole& console) {
   return Cells(console, 1, 42, 37);
 }
@@ -79,15 +97,21 @@ const std::vector<std::string> kRestoreLabels = {
 
 ::testing::AssertionResult SelectEntry(TulkTest::TestConsole& console, const std::string& title,
                                        const std::vector<std::string>& labels) {
+  // A long label is shown up to the last word that fits the right title.
+  const auto shows = [](const std::string& shown, const std::string& label) {
+    return !shown.empty() && label.rfind(shown, 0) == 0 &&
+           (shown.size() == label.size() || label[shown.size()] == ' ');
+  };
   const auto complete = [&](const std::string& shown) {
-    return std::find(labels.begin(), labels.end(), shown) != labels.end();
+    return std::any_of(labels.begin(), labels.end(),
+                       [&](const std::string& label) { return shows(shown, label); });
   };
   if (!WaitUntil(console, [&] { return complete(RightTitle(console)); }, "a menu entry")) {
     return ::testing::AssertionFailure() << "no menu";
   }
   for (std::size_t step = 0; step <= labels.size(); ++step) {
     const std::string shown = RightTitle(console);
-    if (shown == title) {
+    if (shows(shown, title)) {
       return ::testing::AssertionSuccess();
     }
     console.Key("Down");

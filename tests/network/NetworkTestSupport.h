@@ -44,6 +44,13 @@ std::string Cells(const TulkTest::TestConsole& console, int row, int column, int
 std::string RightTitle(const TulkTest::TestConsole& console);
 std::string RightFooter(const TulkTest::TestConsole& console);
 
+/// `text` with every run of blanks made one blank.
+std::string Squeezed(const std::string& text);
+
+/// The right half's description (rows 4 to 21), its lines joined by blanks
+/// and squeezed, so that a wrapped sentence reads as one.
+std::string RightText(const TulkTest::TestConsole& console);
+
 /// The labels of the network restore menu, in order.
 extern const std::vector<std::string> kRestoreLabels;
 

@@ -52,7 +52,8 @@ TEST(RestoreDialogsScreenTest, CreateStandardSwitchWithAFreeUplink) {
   console.Key("Enter");
   ASSERT_TRUE(Acknowledge(console, "Successfully created standard virtual switch: vSwitch5"));
   ASSERT_TRUE(Settled(console, "Restore DVS"));
-  const Json* created = Find(HostState(console)["network"]["switches"], "vSwitch5");
+  const Json network = HostState(console)["network"];
+  const Json* created = Find(network["switches"], "vSwitch5");
   ASSERT_NE(created, nullptr);
   EXPECT_EQ((*created)["uplinks"], Json({"hynic3"}));
 }
@@ -72,10 +73,14 @@ TEST(RestoreDialogsScreenTest, CreatePortGroupOnAChosenSwitchWithAVlan) {
   console.Key("Enter");
   EXPECT_TRUE(console.WaitForText("Invalid VLAN ID"));
   ASSERT_TRUE(Acknowledge(console, "Please reenter a valid VLAN ID (1-4095)."));
+  // The refused value stays for correction.
+  EXPECT_TRUE(console.Contains("[ 5000"));
+  console.Key("Backspace", 4);
   console.Type("20");
   console.Key("Enter");
   ASSERT_TRUE(Acknowledge(console, "Successfully created portgroup: Rescue Net"));
-  const Json* group = Find(HostState(console)["network"]["portGroups"], "Rescue Net");
+  const Json network = HostState(console)["network"];
+  const Json* group = Find(network["portGroups"], "Rescue Net");
   ASSERT_NE(group, nullptr);
   EXPECT_EQ((*group)["switch"], "vSwitch1");
   EXPECT_EQ((*group)["vlanId"], 20);
@@ -107,6 +112,7 @@ TEST(RestoreDialogsScreenTest, RestoreDvsMovesManagementToARepairedPort) {
   console.Type("4095");
   console.Key("Enter");
   ASSERT_TRUE(Acknowledge(console, "Please enter a valid VLAN ID (1-4094)."));
+  console.Key("Backspace", 4);
   console.Type("20");
   console.Key("Down");
   console.Key("Space");
@@ -118,7 +124,7 @@ TEST(RestoreDialogsScreenTest, RestoreDvsMovesManagementToARepairedPort) {
   console.Key("Space");
   console.Key("Enter");
   ASSERT_TRUE(Settled(console, "No uplinks were selected."));
-  console.Key("n");
+  console.Type("n");
   ASSERT_TRUE(Gone(console, "No uplinks were selected."));
   console.Key("Up", 2);
   console.Key("Space");
@@ -145,7 +151,8 @@ TEST(RestoreDialogsScreenTest, RestoreDvsRefusesAnotherVendorsSwitch) {
   ASSERT_TRUE(SelectEntry(console, "Restore DVS"));
   console.Key("Enter");
   EXPECT_TRUE(console.WaitForText("Restore DVS: Error"));
-  ASSERT_TRUE(Acknowledge(console, "operation cannot be performed on 3rd party DVS."));
+  ASSERT_TRUE(Acknowledge(console, "performed on 3rd party DVS."));
+  EXPECT_FALSE(console.Contains("VLAN (optional)"));
   EXPECT_EQ(HostState(console)["network"]["switches"], host["network"]["switches"]);
 }
 

@@ -48,7 +48,8 @@ TEST_F(SwitchRepairTest, StandardSwitchWithAndWithoutUplink) {
   EXPECT_EQ(ReadFreePhysicalNics()[0].name, "hynic3");
 
   EXPECT_TRUE(CreateStandardSwitch("vSwitch5", "hynic3").ok);
-  const json* created = Find(Network()["switches"], "vSwitch5");
+  const json network = Network();
+  const json* created = Find(network["switches"], "vSwitch5");
   ASSERT_NE(created, nullptr);
   EXPECT_EQ((*created)["uplinks"], json({"hynic3"}));
   EXPECT_EQ((*created)["teaming"], json({{"uplinkOrder", {"hynic3"}}, {"maxActive", 1}}));
@@ -75,7 +76,8 @@ TEST_F(SwitchRepairTest, AFailedSwitchCreationLeavesNothingBehind) {
 TEST_F(SwitchRepairTest, PortGroupsAndMigration) {
   Use(Sim::DistributedSwitchDemoHostState());
   EXPECT_TRUE(CreatePortGroup("Rescue", "vSwitch1", 4095).ok);
-  const json* group = Find(Network()["portGroups"], "Rescue");
+  const json network = Network();
+  const json* group = Find(network["portGroups"], "Rescue");
   ASSERT_NE(group, nullptr);
   EXPECT_EQ((*group)["vlanId"], 4095);
   EXPECT_FALSE(CreatePortGroup("Rescue", "vSwitch1", 0).ok);
@@ -142,7 +144,8 @@ TEST_F(SwitchRepairTest, BlockedSettingAndRefusals) {
     HostTest::ClearLog();
     const HostOutcome outcome = RepairManagementDvsPort({0, c.uplinks, c.unblock});
     EXPECT_EQ(outcome.ok, c.ok) << c.what;
-    const json ports = Find(Network()["switches"], "DSwitch-Lab")->at("ports");
+    const json network = Network();
+    const json ports = Find(network["switches"], "DSwitch-Lab")->at("ports");
     if (c.ok) {
       EXPECT_EQ(ports.back()["blocked"], c.newBlocked) << c.what;
     } else {
