@@ -2,7 +2,6 @@
 
 #include <syslog.h>
 
-
 #include "host/ManagementNetwork.h"
 #include "platform/api/HostMgrException.h"
 #include "platform/api/HykernelNicInfoImpl.h"
@@ -48,8 +47,7 @@ std::string FirstFreeSwitchName(const std::function<bool(const std::string&)>& t
   return FirstFreeName("vSwitch", 0, taken);
 }
 
-std::string FirstFreeManagementPortGroupName(
-    const std::function<bool(const std::string&)>& taken) {
+std::string FirstFreeManagementPortGroupName(const std::function<bool(const std::string&)>& taken) {
   return FirstFreeName("Management Network", 1, taken);
 }
 
@@ -77,8 +75,8 @@ bool MoveManagementToNewStandardSwitch() {
         FirstFreeManagementPortGroupName(HykCtl::Network::PortGroupImpl::IsValidPortGroup);
     target.AddPortGroup(portGroup);
 
-    for (HykCtl::Network::HykNicImpl& nic : HykCtl::Network::HykernelNicInfoImpl().GetHykernelNics())
-    {
+    for (HykCtl::Network::HykNicImpl& nic :
+         HykCtl::Network::HykernelNicInfoImpl().GetHykernelNics()) {
       nic.Disable();
     }
     management->ConnectToPortGroup(portGroup);

@@ -18,8 +18,7 @@ std::string FirstFreeName(const std::string& prefix, int first,
 std::string FirstFreeSwitchName(const std::function<bool(const std::string&)>& taken);
 
 /// The new portgroup's name: the first free "Management Network%d" from 1.
-std::string FirstFreeManagementPortGroupName(
-    const std::function<bool(const std::string&)>& taken);
+std::string FirstFreeManagementPortGroupName(const std::function<bool(const std::string&)>& taken);
 
 /// Moves the management network onto a new standard switch:
 /// 1. finds the management kernel NIC and the distributed switch it sits

@@ -16,10 +16,9 @@ std::string RestartAddressReport(const ManagementIpState& state, std::string_vie
       printable.push_back(&entry.address);
     }
   }
-  const std::size_t shown =
-      printable.size() == kRestartReportIpv6Lines + 1 ? printable.size()
-                                                      : std::min(printable.size(),
-                                                                 kRestartReportIpv6Lines);
+  const std::size_t shown = printable.size() == kRestartReportIpv6Lines + 1
+                                ? printable.size()
+                                : std::min(printable.size(), kRestartReportIpv6Lines);
   for (std::size_t i = 0; i < shown; ++i) {
     report += "   " + std::string(ipAddressIs) + *printable[i] + "\n";
   }

@@ -66,8 +66,7 @@ bool CreatePortGroupDialog::Accept() {
                         outcome.error + "\n" + Text(TextId::kCheckSyslog));
     return false;
   }
-  MessageDialog::Show(this, TextId::kOperationSucceeded,
-                      Text(TextId::kPortGroupCreated) + name);
+  MessageDialog::Show(this, TextId::kOperationSucceeded, Text(TextId::kPortGroupCreated) + name);
   return true;
 }
 

@@ -2,7 +2,7 @@
 /// "DVS Uplinks": which of the distributed switch's uplinks the repaired
 /// management port uses.
 ///
-/// 60 x 14, header 6 rows, footer "<Up/Down> Select  <Space> Toggle ...
+/// 70 x 14, header 6 rows, footer "<Up/Down> Select  <Space> Toggle ...
 /// <Enter> OK  <Esc> Cancel", one check box per uplink of the switch. Enter
 /// with no box ticked asks "DVS Uplinks: Warning" / "No uplinks were
 /// selected." / "Do you want to continue?" (Y/N): Y accepts the empty
@@ -18,7 +18,7 @@ namespace Tulk {
 
 class DvsUplinksDialog : public FormDialog {
  public:
-  static constexpr int kWidth = 60;
+  static constexpr int kWidth = 70;
   static constexpr int kHeight = 14;
   static constexpr int kHeaderHeight = 6;
 

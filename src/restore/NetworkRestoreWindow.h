@@ -2,14 +2,18 @@
 /// "Network Restore Options": the full-screen menu of the operations that
 /// give an operator back a working management network.
 ///
-/// | Id | Entry                                   | Opens                  | Footer action | Enabled when |
-/// |----|-----------------------------------------|------------------------|---------------|--------------|
-/// | 65 | Create Standard Switch                  | CreateVssDialog        | Create        | always |
-/// | 66 | Create Port Group                       | CreatePortGroupDialog  | Create        | always |
-/// | 67 | Migrate Hykernel NIC to Standard Switch | MigrateHyknicDialog    | Migrate       | the network-overlay operations agent is present at major version 3 or later |
-/// | 68 | Restore Network Settings                | RestoreNetworkDialog   | Restart       | always |
-/// | 69 | Restore Standard Switch                 | SafeModeNetworkDialog  | Restore       | the management NIC is on a distributed switch |
-/// | 70 | Restore DVS                             | RestoreDVSDialog       | Restore       | the management NIC is on a distributed switch |
+/// | Id | Entry                          | Opens                 | Footer  | Enabled when |
+/// |----|--------------------------------|-----------------------|---------|--------------|
+/// | 65 | Create Standard Switch         | CreateVssDialog       | Create  | always       |
+/// | 66 | Create Port Group              | CreatePortGroupDialog | Create  | always       |
+/// | 67 | Migrate Hykernel NIC to ...    | MigrateHyknicDialog   | Migrate | agent >= 3   |
+/// | 68 | Restore Network Settings       | RestoreNetworkDialog  | Restart | always       |
+/// | 69 | Restore Standard Switch        | SafeModeNetworkDialog | Restore | on a DVS     |
+/// | 70 | Restore DVS                    | RunRestoreDvs()       | Restore | on a DVS     |
+///
+/// "agent >= 3": the network-overlay operations agent is present at major
+/// version 3 or later; "on a DVS": the management NIC sits on a
+/// distributed switch.
 ///
 /// The identifier of an entry is the catalogue id of its label; it selects
 /// the entry's description (71 to 76), its right footer and its dialog. The

@@ -63,8 +63,8 @@ TEST(RestartNetworkScreenTest, OnlyF11RestartsAndTheReportListsTheAddresses) {
        {"..."}},
       {"four static addresses",
        false,
-       Json::array({Ipv6("2001:db8::1"), Ipv6("2001:db8::2"), Ipv6("2001:db8::3"),
-                    Ipv6("2001:db8::4")}),
+       Json::array(
+           {Ipv6("2001:db8::1"), Ipv6("2001:db8::2"), Ipv6("2001:db8::3"), Ipv6("2001:db8::4")}),
        {"   IP address is 10.20.30.41", "   IP address is 2001:db8::2", "   ..."},
        {"2001:db8::3", "2001:db8::4"}},
   };

@@ -91,9 +91,12 @@ std::string RightFooter(const TulkTest::TestConsole& console) {
   return Cells(console, 22, 41, 38);
 }
 
-const std::vector<std::string> kRestoreLabels = {
-    "Create Standard Switch",   "Create Port Group",       "Migrate Hykernel NIC to Standard Switch",
-    "Restore Network Settings", "Restore Standard Switch", "Restore DVS"};
+const std::vector<std::string> kRestoreLabels = {"Create Standard Switch",
+                                                 "Create Port Group",
+                                                 "Migrate Hykernel NIC to Standard Switch",
+                                                 "Restore Network Settings",
+                                                 "Restore Standard Switch",
+                                                 "Restore DVS"};
 
 ::testing::AssertionResult SelectEntry(TulkTest::TestConsole& console, const std::string& title,
                                        const std::vector<std::string>& labels) {
@@ -106,7 +109,8 @@ const std::vector<std::string> kRestoreLabels = {
     return std::any_of(labels.begin(), labels.end(),
                        [&](const std::string& label) { return shows(shown, label); });
   };
-  if (!WaitUntil(console, [&] { return complete(RightTitle(console)); }, "a menu entry")) {
+  if (!WaitUntil(
+          console, [&] { return complete(RightTitle(console)); }, "a menu entry")) {
     return ::testing::AssertionFailure() << "no menu";
   }
   for (std::size_t step = 0; step <= labels.size(); ++step) {

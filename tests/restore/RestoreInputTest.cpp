@@ -50,11 +50,13 @@ TEST(RestoreInputTest, FirstFreeNames) {
   const Case cases[] = {
       {{}, "vSwitch0", "Management Network1"},
       {{"vSwitch0", "vSwitch1", "Management Network1"}, "vSwitch2", "Management Network2"},
-      {{"vSwitch1", "Management Network", "Management Network2"}, "vSwitch0",
+      {{"vSwitch1", "Management Network", "Management Network2"},
+       "vSwitch0",
        "Management Network1"},
       {{"vSwitch0", "vSwitch1", "vSwitch2", "vSwitch3", "vSwitch4", "vSwitch5", "vSwitch6",
         "vSwitch7", "vSwitch8", "vSwitch9"},
-       "vSwitch10", "Management Network1"},
+       "vSwitch10",
+       "Management Network1"},
   };
   for (const Case& c : cases) {
     const auto taken = [&](const std::string& name) { return c.taken.count(name) > 0; };

@@ -47,7 +47,8 @@ TEST(RestoreMenuScreenTest, EntriesAreGreyedByTheirConditions) {
     std::vector<std::string> greyed;
   };
   const Case cases[] = {
-      {"agent 3, standard switch", [] { return Sim::DemoHostState(); },
+      {"agent 3, standard switch",
+       [] { return Sim::DemoHostState(); },
        {"Restore Standard Switch", "Restore DVS"}},
       {"no overlay agent",
        [] {
@@ -63,7 +64,8 @@ TEST(RestoreMenuScreenTest, EntriesAreGreyedByTheirConditions) {
          return host;
        },
        {"Migrate Hykernel NIC to Standard Switch", "Restore Standard Switch", "Restore DVS"}},
-      {"management on a distributed switch", [] { return Sim::DistributedSwitchDemoHostState(); },
+      {"management on a distributed switch",
+       [] { return Sim::DistributedSwitchDemoHostState(); },
        {}},
   };
   for (const Case& c : cases) {
@@ -71,8 +73,7 @@ TEST(RestoreMenuScreenTest, EntriesAreGreyedByTheirConditions) {
     TestConsole console(DriverOptions(c.host(), "restore"));
     ASSERT_TRUE(Settled(console, "Restore DVS"));
     for (const std::string& label : NetworkTest::kRestoreLabels) {
-      const bool expected =
-          std::find(c.greyed.begin(), c.greyed.end(), label) != c.greyed.end();
+      const bool expected = std::find(c.greyed.begin(), c.greyed.end(), label) != c.greyed.end();
       EXPECT_EQ(Greyed(console, label), expected) << label << "\n" << console.Dump();
     }
   }
@@ -203,9 +204,9 @@ TEST(SafeModeScreenTest, ManagementMovesToTheNextFreeSwitchAndTheEntryTurnsGrey)
   EXPECT_TRUE(NetworkTest::WaitUntil(
       console, [&] { return Greyed(console, "Restore Standard Switch"); }, "entry 69 greyed"));
   const Json network = HostState(console)["network"];
-  EXPECT_EQ(network["hykernelNics"][0]["connection"],
-            Json({{"type", "portgroup"}, {"switch", "vSwitch2"},
-                  {"portGroup", "Management Network2"}}));
+  EXPECT_EQ(
+      network["hykernelNics"][0]["connection"],
+      Json({{"type", "portgroup"}, {"switch", "vSwitch2"}, {"portGroup", "Management Network2"}}));
   // Up passes over the grey entry.
   console.Key("Up");
   EXPECT_TRUE(NetworkTest::WaitUntil(

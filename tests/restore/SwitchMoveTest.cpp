@@ -34,15 +34,15 @@ class SwitchMoveTest : public ::testing::Test {
     json& network = state_["network"];
     // A second kernel NIC on the distributed switch, and the names the
     // move must pass over.
-    network["hykernelNics"].push_back({{"name", "hyk1"},
-                                       {"mac", "02:6b:4e:10:20:09"},
-                                       {"enabled", true},
-                                       {"connection",
-                                        {{"type", "dvsPort"},
-                                         {"switch", "DSwitch-Lab"},
-                                         {"portId", "13"}}}});
-    network["switches"].push_back(
-        {{"name", "vSwitch0"}, {"type", "standard"}, {"numPorts", 128}, {"uplinks", json::array()}});
+    network["hykernelNics"].push_back(
+        {{"name", "hyk1"},
+         {"mac", "02:6b:4e:10:20:09"},
+         {"enabled", true},
+         {"connection", {{"type", "dvsPort"}, {"switch", "DSwitch-Lab"}, {"portId", "13"}}}});
+    network["switches"].push_back({{"name", "vSwitch0"},
+                                   {"type", "standard"},
+                                   {"numPorts", 128},
+                                   {"uplinks", json::array()}});
     network["portGroups"].push_back(
         {{"name", "Management Network1"}, {"switch", "vSwitch0"}, {"vlanId", 0}});
   }
@@ -71,8 +71,9 @@ TEST_F(SwitchMoveTest, ManagementMovesToTheFirstFreeNamesWithEveryUplinkInOrder)
   EXPECT_EQ((*group)["switch"], "vSwitch2");
 
   const json& management = *Find(network["hykernelNics"], "hyk0");
-  EXPECT_EQ(management["connection"],
-            json({{"type", "portgroup"}, {"switch", "vSwitch2"}, {"portGroup", "Management Network2"}}));
+  EXPECT_EQ(
+      management["connection"],
+      json({{"type", "portgroup"}, {"switch", "vSwitch2"}, {"portGroup", "Management Network2"}}));
   EXPECT_TRUE(management["enabled"]);
   EXPECT_FALSE(Find(network["hykernelNics"], "hyk1")->at("enabled"));
 }
@@ -107,7 +108,8 @@ TEST_F(SwitchMoveTest, NothingChangesWithoutADistributedManagementNetworkOrOnAFa
   failing["faults"]["VirtualSwitchInfoImpl::AddVirtualSwitch"] = "no room";
   const Case cases[] = {
       {"on a standard switch", Sim::DemoHostState(), "<11>Could not find the management network"},
-      {"no management NIC", [&] {
+      {"no management NIC",
+       [&] {
          json host = state_;
          host["network"]["managementInterface"] = "";
          return host;

@@ -66,8 +66,9 @@ TEST_F(SwitchRepairTest, AFailedSwitchCreationLeavesNothingBehind) {
   EXPECT_FALSE(taken.ok);
   EXPECT_EQ(taken.error, "Physical NIC hynic0 is already an uplink of vSwitch0");
   EXPECT_EQ(Find(Network()["switches"], "vSwitch7"), nullptr);
-  EXPECT_TRUE(Logged("<11>Creating standard virtual switch vSwitch7 failed: Physical NIC hynic0 "
-                     "is already an uplink of vSwitch0"));
+  EXPECT_TRUE(
+      Logged("<11>Creating standard virtual switch vSwitch7 failed: Physical NIC hynic0 "
+             "is already an uplink of vSwitch0"));
   const HostOutcome duplicate = CreateStandardSwitch("vSwitch1", "");
   EXPECT_FALSE(duplicate.ok);
   EXPECT_NE(Find(Network()["switches"], "vSwitch1"), nullptr);
@@ -115,8 +116,9 @@ TEST_F(SwitchRepairTest, TheRepairedPortCarriesTheManagementNetwork) {
                                    {"blocked", false},
                                    {"hostLocal", true}}));
   EXPECT_EQ(Find(network["hykernelNics"], "hyk0")->at("connection")["portId"], "14");
-  EXPECT_TRUE(Logged("<14>Restoring DVS DSwitch-Lab: new host local port 14 for hyk0 (VLAN 20, "
-                     "uplinks hynic0,hynic1)"));
+  EXPECT_TRUE(
+      Logged("<14>Restoring DVS DSwitch-Lab: new host local port 14 for hyk0 (VLAN 20, "
+             "uplinks hynic0,hynic1)"));
   EXPECT_EQ(PingThroughManagement(), 0);
 }
 

@@ -245,7 +245,8 @@ bool PortsetImpl::IsThirdParty() const {
 }
 
 HostMgr::Network::DvsPort PortsetImpl::GetDvsPort(const std::string& portId) const {
-  const Sim::json& port = RequirePort(RequireDistributed(Sim::Query(Op("GetDvsPort")), name_), portId);
+  const Sim::json& port =
+      RequirePort(RequireDistributed(Sim::Query(Op("GetDvsPort")), name_), portId);
   HostMgr::Network::DvsPort result;
   result.id = portId;
   result.vlanId = port.value("vlanId", 0);

@@ -356,11 +356,12 @@ void CheckNetwork(const json* network) {
   Fields(Member(network, "routing"), at + ".routing",
          {{"ipv4Gateway", Type::kIpv4}, {"ipv6Gateway", Type::kIpv6}});
   Elements(network, at, "reachable", Type::kString, Nothing);
-  Values(network, at, "dnsRecords", Type::kArray, [](const json& addresses, const std::string& path) {
-    for (std::size_t i = 0; i < addresses.size(); ++i) {
-      Expect(addresses[i], path + "[" + std::to_string(i) + "]", Type::kIp);
-    }
-  });
+  Values(network, at, "dnsRecords", Type::kArray,
+         [](const json& addresses, const std::string& path) {
+           for (std::size_t i = 0; i < addresses.size(); ++i) {
+             Expect(addresses[i], path + "[" + std::to_string(i) + "]", Type::kIp);
+           }
+         });
 }
 
 void CheckSystem(const json* system) {

@@ -46,9 +46,8 @@ int Ping(ToolRun& run) {
   // Through an interface whose port passes no traffic (a blocked
   // distributed-switch port, or one without a working uplink) nothing
   // answers.
-  const bool reachable =
-      IsReachable(state, address) &&
-      (interface.empty() || KernelNicCarriesTraffic(state, interface));
+  const bool reachable = IsReachable(state, address) &&
+                         (interface.empty() || KernelNicCarriesTraffic(state, interface));
   run.Out("PING " + address + ": 56 data bytes\n");
   if (reachable) {
     run.Out("\n--- " + address + " ping statistics ---\n" + count + " packets transmitted, " +
