@@ -111,8 +111,10 @@ TEST(RestoreMenuScreenTest, RightHalfFollowsTheSelection) {
     EXPECT_TRUE(NetworkTest::WaitUntil(
         console, [&] { return NetworkTest::Squeezed(RightFooter(console)) == step.footer; },
         step.footer));
-    const std::string text = NetworkTest::RightText(console);
-    EXPECT_NE(text.find(step.description), std::string::npos) << text;
+    EXPECT_TRUE(NetworkTest::WaitUntil(
+        console,
+        [&] { return NetworkTest::RightText(console).find(step.description) != std::string::npos; },
+        step.description));
   }
   EXPECT_EQ(NetworkTest::RightText(console).find("BrimLo DVS."), std::string::npos);
   console.Key("Esc");
