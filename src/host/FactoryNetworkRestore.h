@@ -6,9 +6,11 @@
 
 namespace Tulk {
 
-/// Whether a virtual machine is running on the host. A host-control
-/// failure logs "Checking for running VMs failed: %s" at error level and
-/// gives true: the operator is then asked before anything is powered off.
+/// Whether a virtual machine is running on the host.
+///
+/// Decision of this implementation: a host-control failure logs "Checking
+/// for running VMs failed: %s" at error level and gives true, so that the
+/// operator is asked before anything may be powered off.
 bool HasRunningVirtualMachines();
 
 /// Runs "/sbin/powerOffVms" with the arguments "powerOffVms" alone, logged

@@ -27,13 +27,16 @@ struct KnownTestAddresses {
   std::string ipv6Gateway;
 };
 
-/// The default ping targets, at most kPingTargetCount, in this order: the
-/// IPv4 default gateway, the IPv4 name servers in their configured order,
-/// then, only when IPv6 is enabled in the kernel, the IPv6 default gateway
-/// and the IPv6 name servers. Each family's gateway comes before its name
-/// servers (the first hop before what lies beyond it). Empty and all-zero
-/// addresses and repeats are passed over; the first three that remain are
-/// taken.
+/// The default ping targets, at most kPingTargetCount.
+///
+/// Decisions of this implementation (the order when more than three are
+/// known): the IPv4 default gateway, the IPv4 name servers in their
+/// configured order, then, only when IPv6 is enabled in the kernel, the
+/// IPv6 default gateway and the IPv6 name servers. Each family's gateway
+/// comes before its name servers (the first hop before what lies beyond
+/// it), and IPv4 before IPv6 (the management address the host is known by).
+/// Empty and all-zero addresses and repeats are passed over; the first
+/// three that remain are taken.
 std::vector<std::string> OrderPingTargets(const KnownTestAddresses& known);
 
 /// The name the test resolves: `hostName` "." `domain`, or the bare host

@@ -36,6 +36,10 @@ std::string FirstFreeManagementPortGroupName(const std::function<bool(const std:
 /// failed: %s" at error level and ends the move where it stands. Returns
 /// true when the management NIC was connected to the new portgroup and is
 /// in service again.
+///
+/// Decision of this implementation: every moved uplink is active (the
+/// teaming maximum follows the number of uplinks), as they were all carrying
+/// the distributed switch's traffic.
 bool MoveManagementToNewStandardSwitch();
 
 }  // namespace Tulk

@@ -21,6 +21,12 @@
 /// closes with 1; or "Operation Failed" with the host's message (a name
 /// already taken, say) and "Please check the syslog for more information.",
 /// and the form stays open. Esc returns 0 and creates nothing.
+///
+/// Decisions of this implementation: everything above; the dialog is not
+/// described further than the restore menu's entry. The switch is chosen
+/// from the host's standard switches rather than typed, so that only an
+/// existing one can be named; a refused value stays in its field to be
+/// corrected.
 
 #include "host/StandardSwitchInfo.h"
 #include "toolkit/CarouselRadioItem.h"

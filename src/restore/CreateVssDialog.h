@@ -19,6 +19,13 @@
 /// the form closes with 1; or "Operation Failed" with the host's message and
 /// "Please check the syslog for more information.", and the form stays
 /// open. Esc returns 0 and creates nothing.
+///
+/// Decisions of this implementation: everything above; the dialog is not
+/// described further than the restore menu's entry. After a host failure
+/// the form stays open with the values, so the operator can change them or
+/// leave with Esc. A name already taken is left to the host to refuse (its
+/// message names the switch). The "Uplink:" heading is the dialog's own
+/// text.
 
 #include <string>
 #include <vector>

@@ -16,6 +16,9 @@
 /// A host failure in steps 2 to 4 shows "Failed." and logs
 /// "auto-configuring network failed", whichever step failed. The report
 /// then waits for Enter alone (footer "<Enter> OK") and returns 1.
+///
+/// Decision of this implementation: each step's line ends where the next
+/// one starts ("\n" before it), so the two lines fit the 2-row report.
 
 #include "toolkit/ProgressDialog.h"
 

@@ -16,6 +16,11 @@
 /// portgroup, and the form closes with 1; or "Operation Failed" with the
 /// host's message and "Please check the syslog for more information.", and
 /// the form stays open. Esc returns 0 and changes nothing.
+///
+/// Decisions of this implementation: everything above; the dialog is not
+/// described further than the restore menu's entry. An empty list is
+/// refused with the dialog's own prompt, the catalogue having no text of
+/// its own for it.
 
 #include "host/HykNicInfo.h"
 #include "host/PortGroupInfo.h"

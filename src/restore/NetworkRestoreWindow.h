@@ -34,6 +34,9 @@
 /// "Restore Standard Switch" that returned 1, entry 69 turns grey for the
 /// rest of the window's life and the cursor moves down to "Restore DVS",
 /// without a full redraw.
+///
+/// Decision of this implementation: after a dialog the window keeps the
+/// entry the operator chose selected.
 
 #include <cstdint>
 

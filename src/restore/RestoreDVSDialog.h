@@ -34,6 +34,8 @@
 ///   or none.
 /// - The repair needs no separate F11 confirmation: the form itself is the
 ///   operator's deliberate choice of the new port's settings.
+/// - The success message is the dialog's own text, "The management network
+///   now uses a new DVS host local port.", under "Operation Succeeded".
 
 #include <string>
 #include <vector>
