@@ -147,7 +147,7 @@ TEST(TestNetworkScreenTest, SkippedInputsKeepTheirNumbersAndEveryCheckReports) {
 
 TEST(TestNetworkScreenTest, EscDuringAPingEndsTheTestAtOnce) {
   Json host = DemoHostState();
-  host["commands"]["hykping -c 3 -I hyk0 10.20.30.1"] = {{"delayMs", 20000}};
+  host["commands"]["hykping -c 3 -I hyk0 10.20.30.1"] = {{"delayMs", 5000}};
   TestConsole console(DriverOptions(host, "test"));
   ASSERT_TRUE(Settled(console, "Resolve Hostname"));
   console.Key("Enter");
@@ -163,6 +163,10 @@ TEST(TestNetworkScreenTest, EscDuringAPingEndsTheTestAtOnce) {
   for (const Json& record : TulkTest::SimRecords(console.Root(), "commands.jsonl")) {
     EXPECT_TRUE(record["exitCode"].is_null()) << record.dump();
   }
+  // The abandoned ping ends by itself (and leaves nothing running).
+  EXPECT_TRUE(WaitUntil(
+      console, [&] { return TulkTest::SimRecords(console.Root(), "commands.jsonl").size() == 2; },
+      "the abandoned ping to end", 15s));
 }
 
 TEST(TestNetworkScreenTest, WithoutAManagementInterfaceThePingNamesNoInterface) {
