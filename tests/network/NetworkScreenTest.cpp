@@ -216,3 +216,35 @@ TEST(TestNetworkScreenTest, KilledDuringTheNameCheckTheNextStartRestoresTheHosts
 }
 
 }  // namespace
+
+namespace {
+
+TEST(SystemCustomizationScreenTest, TheThreeNetworkEntriesOpenTheirScreens) {
+  const std::vector<std::string> labels = {
+      "Configure Password",         "Configure Lockdown Mode", "Configure Management Network",
+      "Restart Management Network", "Test Management Network", "Network Restore Options",
+      "Troubleshooting Options",    "View System Logs",        "View Support Information",
+      "Reset System Configuration", "Configure Keyboard"};
+  struct Case {
+    const char* entry;
+    const char* shown;
+    const char* leave;
+  };
+  const Case cases[] = {
+      {"Restart Management Network", "Restart management network now?", "Esc"},
+      {"Test Management Network", "Ping Address #1:", "Esc"},
+      {"Network Restore Options", "Create Standard Switch", "Esc"},
+  };
+  TestConsole console(DriverOptions(DemoHostState(), "menu"));
+  for (const Case& c : cases) {
+    ASSERT_TRUE(NetworkTest::SelectEntry(console, c.entry, labels));
+    console.Key("Enter");
+    ASSERT_TRUE(Settled(console, c.shown));
+    console.Key(c.leave);
+    ASSERT_TRUE(NetworkTest::Gone(console, c.shown));
+    EXPECT_TRUE(WaitUntil(
+        console, [&] { return NetworkTest::RightTitle(console) == c.entry; }, c.entry));
+  }
+}
+
+}  // namespace
