@@ -3,14 +3,27 @@
 # built-in simulated host, confined to a demo root (build/demo-root, or
 # TULK_DEMO_ROOT). Changes made in the console persist in the demo root's
 # host state; delete the folder to start afresh.
+#
+#   scripts/demo.sh [--dvs] [vt]
+#
+# --dvs runs a second demo host, in build/demo-root-dvs, whose management
+# network sits on a misconfigured distributed switch: the network restore
+# options "Restore DVS" and "Restore Standard Switch" have something to do.
 set -euo pipefail
 cd "$(dirname "$0")/.."
 
 scripts/setup.sh
 scripts/build.sh default --target tulk tulk-hosttool >/dev/null
 
-root=${TULK_DEMO_ROOT:-$PWD/build/demo-root}
-scripts/make-demo-root.sh "$root" >/dev/null
+variant=()
+default_root=$PWD/build/demo-root
+if [[ ${1:-} == --dvs ]]; then
+  variant=(--dvs)
+  default_root=$PWD/build/demo-root-dvs
+  shift
+fi
+root=${TULK_DEMO_ROOT:-$default_root}
+scripts/make-demo-root.sh "${variant[@]}" "$root" >/dev/null
 
 environment=(TULK_ROOT="$root")
 if [[ -f $root/var/lib/tulk-sim/host-state.json ]]; then

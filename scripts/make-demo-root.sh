@@ -10,22 +10,29 @@
 # state (var/lib/tulk-sim/host-state.json), which the console and the tools
 # then change, so changes persist across runs. Running the script again
 # refreshes the tools and leaves everything else as it is; --fresh-state
-# puts the demo host's state back.
+# puts the demo host's state back. --dvs makes the state it writes (a new
+# root, or with --fresh-state) the variant whose management network sits
+# on a misconfigured distributed switch ("tulk-hosttool --demo-state dvs").
 #
 # The tool is taken from TULK_HOSTTOOL, else from the newest build folder
 # of this checkout.
 set -eu
 
 usage() {
-  echo "usage: $0 [--fresh-state] <root>" >&2
+  echo "usage: $0 [--fresh-state] [--dvs] <root>" >&2
   exit 2
 }
 
 fresh=0
-if [ "${1:-}" = "--fresh-state" ]; then
-  fresh=1
+variant=
+while [ $# -gt 1 ]; do
+  case $1 in
+    --fresh-state) fresh=1 ;;
+    --dvs) variant=dvs ;;
+    *) usage ;;
+  esac
   shift
-fi
+done
 [ $# -eq 1 ] || usage
 root=$1
 case $root in
@@ -52,7 +59,7 @@ mkdir -p "$root"
 # The host state.
 state=$root/var/lib/tulk-sim/host-state.json
 if [ $fresh -eq 1 ] || [ ! -f "$state" ]; then
-  "$tool" --demo-state > "$state.new"
+  "$tool" --demo-state $variant > "$state.new"
   mv "$state.new" "$state"
 fi
 

@@ -6,6 +6,7 @@
 #include <memory>
 
 #include "host/HostStartup.h"
+#include "host/HostsFileBackup.h"
 #include "platform/api/HostMgrException.h"
 #include "runtime/Console.h"
 #include "runtime/SystemLog.h"
@@ -17,6 +18,9 @@
 namespace {
 
 void AfterStartup() {
+  // Before anything reads the hosts file: a network test that was cut off
+  // between its backup and restore left the real file in the backup.
+  Tulk::RecoverHostsFile();
   Tulk::StartHostServices();
   Tulk::RegisterSupportValueProviders();
 }

@@ -8,7 +8,10 @@
 #include "host/ManagementNetwork.h"
 #include "include/ProcessFlags.h"
 #include "network/NetworkWindow.h"
+#include "network/RestartNetworkDialog.h"
+#include "network/TestDialog.h"
 #include "render/TextId.h"
+#include "restore/NetworkRestoreWindow.h"
 #include "screens/ChangePasswordDialog.h"
 #include "screens/KeyboardDialog.h"
 #include "screens/LockdownDialog.h"
@@ -201,7 +204,20 @@ bool GeneralWindow::Open(std::uint32_t id) {
         ShowMessage(this, TextId::kRestartNetworkErrorTitle, TextId::kNoManagementInterface);
         return true;
       }
-      return false;
+      RunDialog<RestartNetworkDialog>(this);
+      return true;
+    case kEntryTestNetwork:
+      RunDialog<TestDialog>(this);
+      return true;
+    case kEntryNetworkRestore: {
+      RunDialog<NetworkRestoreWindow>(this);
+      // A restore may have replaced the management NIC the entries depend on.
+      const std::uint32_t selected = SelectedId(kEntrySeparator);
+      ReadHostState();
+      BuildEntries();
+      SelectId(selected);
+      return true;
+    }
     case kEntryResetConfiguration:
       if (RunDialog<RestoreDialog>(this) == 0) {
         ShowMessage(this, TextId::kResetErrorTitle, TextId::kResetFailed);

@@ -62,6 +62,11 @@
 ///   with the same entry selected (when that entry is still enabled, else
 ///   the first entry). Enter on entries 11 and 12 does nothing and redraws
 ///   nothing.
+/// - Entry 8 opens RestartNetworkDialog (after the missing-interface
+///   message when there is no management NIC), entry 9 TestDialog, entry 10
+///   NetworkRestoreWindow; after the restore window the host state is read
+///   again and the entries rebuilt, since a restore may have replaced the
+///   management NIC.
 
 #include <cstdint>
 #include <string>

@@ -91,6 +91,21 @@ inline constexpr char kRestartNowLater[] =
     "{color:black}<F11>{/color} {color:dark-grey}Restart Now{/color}"
     "{align:right}{color:black}<Esc>{/color} {color:dark-grey}Restart Later{/color}{/align}";
 
+/// "<Left/Right> Change  <D> Details ... <Enter> OK  <Esc> Cancel": forms
+/// whose choices are carousels of list entries.
+inline constexpr char kChangeDetailsOkCancel[] =
+    "{color:black}<Left/Right>{/color} {color:dark-grey}Change{/color}  "
+    "{color:black}<D>{/color} {color:dark-grey}Details{/color}"
+    "{align:right}{color:black}<Enter>{/color} {color:dark-grey}OK{/color}  "
+    "{color:black}<Esc>{/color} {color:dark-grey}Cancel{/color}{/align}";
+/// "<Up/Down> Select  <Space> Toggle ... <Enter> OK  <Esc> Cancel": forms
+/// with check boxes.
+inline constexpr char kSelectToggleOkCancel[] =
+    "{color:black}<Up/Down>{/color} {color:dark-grey}Select{/color}  "
+    "{color:black}<Space>{/color} {color:dark-grey}Toggle{/color}"
+    "{align:right}{color:black}<Enter>{/color} {color:dark-grey}OK{/color}  "
+    "{color:black}<Esc>{/color} {color:dark-grey}Cancel{/color}{/align}";
+
 // Full-screen menus.
 /// The left footer of every menu.
 inline constexpr char kMenuSelect[] =

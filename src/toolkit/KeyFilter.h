@@ -20,6 +20,8 @@
 /// | kIpv6Network  | 0-9 a-f A-F : / .                           | full    |
 /// | kHostName     | letters 0-9 - .                             | full    |
 /// | kSuffixes     | letters 0-9 blank . , -                     | full    |
+/// | kPingAddress  | letters 0-9 . : %                           | full    |
+/// | kSwitchName   | letters 0-9 - _ .                           | full    |
 ///
 /// Letters are the ASCII letters whatever the locale.
 
@@ -63,6 +65,13 @@ inline constexpr KeyFilter kHostName{KeyFilter::kClassDigits | KeyFilter::kClass
                                      KeyFilter::Editing::kFull};
 inline constexpr KeyFilter kSuffixes{KeyFilter::kClassDigits | KeyFilter::kClassLetters, " .,-",
                                      KeyFilter::Editing::kFull};
+/// An address to ping, IPv4 or IPv6, with an optional "%zone" (an
+/// interface name).
+inline constexpr KeyFilter kPingAddress{KeyFilter::kClassDigits | KeyFilter::kClassLetters, ".:%",
+                                        KeyFilter::Editing::kFull};
+/// A standard switch's name.
+inline constexpr KeyFilter kSwitchName{KeyFilter::kClassDigits | KeyFilter::kClassLetters, "-_.",
+                                       KeyFilter::Editing::kFull};
 // clang-format on
 
 }  // namespace Tulk

@@ -1,6 +1,7 @@
 #include "toolkit/MessageDialog.h"
 
 #include "include/Keys.h"
+#include "toolkit/RunFrame.h"
 
 namespace Tulk {
 
@@ -21,6 +22,11 @@ int MessageDialog::Run() {
   while (WaitKey() != kKeyEnter) {
   }
   return 1;
+}
+
+void MessageDialog::Show(Frame* owner, std::uint32_t titleId, std::string message) {
+  MessageDialog dialog(owner, titleId, std::move(message));
+  RunFrame(&dialog);
 }
 
 }  // namespace Tulk

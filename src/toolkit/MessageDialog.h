@@ -26,6 +26,11 @@ class MessageDialog : public Dialog {
   /// Enter; returns 1.
   int Run() override;
 
+  /// Runs a message dialog of the default size above `owner` until Enter
+  /// closes it (the dialog lives on the stack, so the idle timeout unwinds
+  /// through it).
+  static void Show(Frame* owner, std::uint32_t titleId, std::string message);
+
   /// The message.
   const std::string& Message() const { return message_; }
 

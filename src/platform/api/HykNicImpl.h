@@ -63,13 +63,18 @@ class HykNicImpl {
   void SetMacAddressFromPnic(const std::string& pnicName);
   /// Attaches the NIC to the standard-switch portgroup `portGroup`.
   void ConnectToPortGroup(const std::string& portGroup);
+  /// Attaches the NIC to port `portId` of the distributed switch
+  /// `dvsName`. Throws when the switch is not distributed or has no such
+  /// port.
+  void ConnectToDvsPort(const std::string& dvsName, const std::string& portId);
 
   /// Takes the NIC out of service (interface down, addresses kept).
   void Disable();
   /// Brings the NIC into service again.
   void Enable();
   /// Restarts the interface: Disable then Enable as one operation (used
-  /// after a VLAN change and by "Restart Management Network").
+  /// after a VLAN change and by "Restart Management Network"). A NIC on
+  /// DHCP asks for its lease again as it comes up.
   void Restart();
 
  private:

@@ -5,6 +5,7 @@
 #include <string>
 #include <vector>
 
+#include "platform/api/DvsPort.h"
 #include "platform/api/NicTeamingPolicy.h"
 
 namespace HykCtl::Network {
@@ -66,6 +67,23 @@ class PortsetImpl {
   void AddPortGroup(const std::string& name, int vlanId = 0);
   /// Removes portgroup `name`; throws while a kernel NIC uses it.
   void RemovePortGroup(const std::string& name);
+
+  // Distributed switches only; each throws "Not a distributed switch
+  // <name>" for a standard switch.
+  /// True for a distributed switch made by another vendor than the host's:
+  /// the host can read its ports but not add any.
+  bool IsThirdParty() const;
+  /// The port `portId`. Throws "Port <id> not found on <name>" when there
+  /// is none.
+  HostMgr::Network::DvsPort GetDvsPort(const std::string& portId) const;
+  /// Adds a host-local port: a copy of port `clonePortId` (every property
+  /// the host keeps for it) with the VLAN, uplinks and blocked state of
+  /// `settings` (its id and hostLocal are ignored). Returns the new port's
+  /// id. Throws for a third-party switch ("Operation not supported on
+  /// third-party distributed switch <name>"), an unknown port, an uplink
+  /// that is not one of the switch's, or a VLAN outside 0..4094.
+  std::string AddHostLocalPort(const std::string& clonePortId,
+                               const HostMgr::Network::DvsPort& settings);
 
  private:
   std::string name_;

@@ -126,7 +126,12 @@ nlohmann::json DemoHostState() {
       "searchDomains": ["lab.example.net", "example.net"]
     },
     "routing": { "ipv4Gateway": "10.20.30.1", "ipv6Gateway": "fe80::1%hyk0" },
-    "reachable": ["10.20.30.1", "10.20.30.2", "10.20.30.3", "fe80::1"]
+    "reachable": ["10.20.30.1", "10.20.30.2", "10.20.30.3", "fe80::1"],
+    "dnsRecords": {
+      "tavi-01.lab.example.net": ["10.20.30.41", "2001:db8:20:30::41"],
+      "helmsman.lab.example.net": ["10.20.30.5"],
+      "gateway.lab.example.net": ["10.20.30.1"]
+    }
   },
   "vms": [
     { "name": "build-agent-01", "state": "running", "autostart": true },
@@ -167,6 +172,31 @@ nlohmann::json DemoHostState() {
   "faults": {}
 }
 )json");
+}
+
+nlohmann::json DistributedSwitchDemoHostState() {
+  nlohmann::json state = DemoHostState();
+  nlohmann::json& network = state["network"];
+  network["switches"] = nlohmann::json::parse(R"json([
+    { "name": "vSwitch1", "type": "standard", "numPorts": 128, "configuredPorts": 128,
+      "mtu": 1500, "uplinks": ["hynic2"],
+      "teaming": { "uplinkOrder": ["hynic2"], "maxActive": 1 } },
+    { "name": "DSwitch-Lab", "type": "distributed", "numPorts": 512, "configuredPorts": 512,
+      "mtu": 1500, "uplinks": ["hynic0", "hynic1", "hynic3"],
+      "portGroups": ["DPG-Management", "DPG-Workloads"],
+      "ports": [
+        { "id": "12", "vlanId": 30, "uplinks": ["hynic3"], "blocked": false,
+          "hostLocal": false },
+        { "id": "13", "vlanId": 40, "uplinks": ["hynic0", "hynic1"], "blocked": false,
+          "hostLocal": false }
+      ] }
+  ])json");
+  network["portGroups"] = nlohmann::json::parse(R"json([
+    { "name": "VM Network", "switch": "vSwitch1", "vlanId": 0, "vmClients": 1 }
+  ])json");
+  network["hykernelNics"][0]["connection"] = {
+      {"type", "dvsPort"}, {"switch", "DSwitch-Lab"}, {"portId", "12"}};
+  return state;
 }
 
 }  // namespace Sim

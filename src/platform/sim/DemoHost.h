@@ -15,4 +15,13 @@ namespace Sim {
 /// operations agent at version 3.
 nlohmann::json DemoHostState();
 
+/// The demo host after its management network was moved onto a distributed
+/// switch, "DSwitch-Lab" (uplinks hynic0, hynic1 and hynic3), and then
+/// misconfigured: hyk0 sits on port 12, whose only uplink, hynic3, has no
+/// link, so the management network passes no traffic until it is repaired
+/// ("Restore DVS") or moved to a standard switch ("Restore Standard
+/// Switch"). vSwitch0 and "Management Network" are gone; vSwitch1 with "VM
+/// Network" stays.
+nlohmann::json DistributedSwitchDemoHostState();
+
 }  // namespace Sim

@@ -141,6 +141,21 @@ void HykNicImpl::ConnectToPortGroup(const std::string& portGroup) {
   Refresh();
 }
 
+void HykNicImpl::ConnectToDvsPort(const std::string& dvsName, const std::string& portId) {
+  Sim::Change(Op("ConnectToDvsPort"), [&](Sim::json& state) {
+    const Sim::json& vswitch = Sim::RequireSwitch(state, dvsName);
+    if (Sim::StringAt(vswitch, "type", "standard") != "distributed") {
+      Sim::Fail("Not a distributed switch " + dvsName);
+    }
+    if (Sim::FindDvsPort(vswitch, portId) == nullptr) {
+      Sim::Fail("Port " + portId + " not found on " + dvsName);
+    }
+    Sim::RequireKernelNic(state, name_)["connection"] = {
+        {"type", "dvsPort"}, {"switch", dvsName}, {"portId", portId}};
+  });
+  Refresh();
+}
+
 void HykNicImpl::Disable() {
   Sim::Change(Op("Disable"),
               [&](Sim::json& state) { Sim::RequireKernelNic(state, name_)["enabled"] = false; });
@@ -158,6 +173,19 @@ void HykNicImpl::Restart() {
     Sim::json& nic = Sim::RequireKernelNic(state, name_);
     nic["enabled"] = true;
     nic["restarts"] = nic.value("restarts", 0) + 1;
+    if (Sim::StringAt(Sim::ObjectAt(nic, "ipv4"), "mode") == "dhcp") {
+      // The DHCP client starts over: bound again when the network has a
+      // DHCP server, waiting without a lease otherwise.
+      const Sim::json& offer = Sim::ObjectAt(state["network"], "dhcpOffer");
+      if (offer.empty()) {
+        nic["dhcpLease"] = nullptr;
+      } else {
+        Sim::json lease = offer;
+        lease["bound"] = true;
+        lease["renewals"] = Sim::ObjectAt(nic, "dhcpLease").value("renewals", 0);
+        nic["dhcpLease"] = std::move(lease);
+      }
+    }
   });
   Refresh();
 }

@@ -1,6 +1,7 @@
 #include "platform/api/PortsetImpl.h"
 
 #include <algorithm>
+#include <cstdlib>
 
 #include "platform/sim/SimState.h"
 
@@ -30,6 +31,36 @@ void EraseName(Sim::json& array, const std::string& name) {
       return;
     }
   }
+}
+
+const Sim::json& RequireDistributed(const Sim::json& state, const std::string& name) {
+  const Sim::json& vswitch = Sim::RequireSwitch(state, name);
+  if (IsStandard(vswitch)) {
+    Sim::Fail("Not a distributed switch " + name);
+  }
+  return vswitch;
+}
+
+const Sim::json& RequirePort(const Sim::json& vswitch, const std::string& id) {
+  const Sim::json* port = Sim::FindDvsPort(vswitch, id);
+  if (port == nullptr) {
+    Sim::Fail("Port " + id + " not found on " + Sim::StringAt(vswitch, "name"));
+  }
+  return *port;
+}
+
+// The next port id: one above the highest numeric id in use.
+std::string NextPortId(const Sim::json& vswitch) {
+  long highest = 0;
+  for (const Sim::json& port : Sim::ArrayAt(vswitch, "ports")) {
+    const std::string id = Sim::StringAt(port, "id");
+    char* end = nullptr;
+    const long value = std::strtol(id.c_str(), &end, 10);
+    if (!id.empty() && end != nullptr && *end == '\0' && value > highest) {
+      highest = value;
+    }
+  }
+  return std::to_string(highest + 1);
 }
 
 std::vector<std::string> Strings(const Sim::json& array) {
@@ -128,6 +159,7 @@ void PortsetImpl::RemoveUplink(const std::string& pnic) {
 
 void PortsetImpl::MoveUplink(const std::string& pnic, const std::string& targetSwitch) {
   Sim::Change(Op("MoveUplink"), [&](Sim::json& state) {
+    Sim::RequirePnic(state, pnic);
     if (Sim::SwitchOfUplink(state, pnic) != name_) {
       Sim::Fail("Physical NIC " + pnic + " is not an uplink of " + name_);
     }
@@ -202,6 +234,55 @@ void PortsetImpl::RemovePortGroup(const std::string& name) {
       }
     }
   });
+}
+
+}  // namespace HykCtl::Network
+
+namespace HykCtl::Network {
+
+bool PortsetImpl::IsThirdParty() const {
+  return RequireDistributed(Sim::Query(Op("IsThirdParty")), name_).value("thirdParty", false);
+}
+
+HostMgr::Network::DvsPort PortsetImpl::GetDvsPort(const std::string& portId) const {
+  const Sim::json& port =
+      RequirePort(RequireDistributed(Sim::Query(Op("GetDvsPort")), name_), portId);
+  HostMgr::Network::DvsPort result;
+  result.id = portId;
+  result.vlanId = port.value("vlanId", 0);
+  result.uplinks = Strings(Sim::ArrayAt(port, "uplinks"));
+  result.blocked = port.value("blocked", false);
+  result.hostLocal = port.value("hostLocal", false);
+  return result;
+}
+
+std::string PortsetImpl::AddHostLocalPort(const std::string& clonePortId,
+                                          const HostMgr::Network::DvsPort& settings) {
+  std::string id;
+  Sim::Change(Op("AddHostLocalPort"), [&](Sim::json& state) {
+    const Sim::json& vswitch = RequireDistributed(state, name_);
+    if (vswitch.value("thirdParty", false)) {
+      Sim::Fail("Operation not supported on third-party distributed switch " + name_);
+    }
+    if (settings.vlanId < 0 || settings.vlanId > 4094) {
+      Sim::Fail("Invalid VLAN id " + std::to_string(settings.vlanId));
+    }
+    const std::vector<std::string> uplinks = Strings(Sim::ArrayAt(vswitch, "uplinks"));
+    for (const std::string& uplink : settings.uplinks) {
+      if (std::find(uplinks.begin(), uplinks.end(), uplink) == uplinks.end()) {
+        Sim::Fail("Physical NIC " + uplink + " is not an uplink of " + name_);
+      }
+    }
+    Sim::json port = RequirePort(vswitch, clonePortId);
+    id = NextPortId(vswitch);
+    port["id"] = id;
+    port["vlanId"] = settings.vlanId;
+    port["uplinks"] = settings.uplinks;
+    port["blocked"] = settings.blocked;
+    port["hostLocal"] = true;
+    Sim::ArrayFor(Sim::RequireSwitch(state, name_), "ports").push_back(std::move(port));
+  });
+  return id;
 }
 
 }  // namespace HykCtl::Network

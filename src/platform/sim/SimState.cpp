@@ -9,6 +9,7 @@
 #include <ctime>
 
 #include "platform/api/HostMgrException.h"
+#include "platform/api/IpAddress.h"
 #include "platform/sim/SimHost.h"
 
 namespace Sim {
@@ -150,6 +151,63 @@ std::string SwitchOfUplink(const json& state, std::string_view pnic) {
     }
   }
   return "";
+}
+
+bool SameIpAddress(const std::string& a, const std::string& b) {
+  const std::string x = a.substr(0, a.find('%'));
+  const std::string y = b.substr(0, b.find('%'));
+  auto first = HostMgr::Network::IpAddress::Parse(x);
+  auto second = HostMgr::Network::IpAddress::Parse(y);
+  return first != nullptr && second != nullptr ? *first == *second : x == y;
+}
+
+bool IsReachable(const json& state, const std::string& address) {
+  for (const json& known : ArrayAt(ObjectAt(state, "network"), "reachable")) {
+    if (known.is_string() && SameIpAddress(known.get<std::string>(), address)) {
+      return true;
+    }
+  }
+  return false;
+}
+
+const json* FindDvsPort(const json& vswitch, std::string_view id) {
+  for (const json& port : ArrayAt(vswitch, "ports")) {
+    if (StringAt(port, "id") == id) {
+      return &port;
+    }
+  }
+  return nullptr;
+}
+
+bool KernelNicCarriesTraffic(const json& state, std::string_view name) {
+  const json& network = ObjectAt(state, "network");
+  const json* nic = FindByName(ArrayAt(network, "hykernelNics"), name);
+  if (nic == nullptr || !nic->value("enabled", true)) {
+    return false;
+  }
+  const json& connection = ObjectAt(*nic, "connection");
+  const std::string type = StringAt(connection, "type");
+  if (type == "portgroup" || type == "opaqueNetwork") {
+    return true;
+  }
+  if (type != "dvsPort") {
+    return false;
+  }
+  const json* vswitch = FindByName(ArrayAt(network, "switches"), StringAt(connection, "switch"));
+  const json* port =
+      vswitch != nullptr ? FindDvsPort(*vswitch, StringAt(connection, "portId")) : nullptr;
+  if (port == nullptr || port->value("blocked", false)) {
+    return false;
+  }
+  for (const json& uplink : ArrayAt(*port, "uplinks")) {
+    const std::string pnic = uplink.get<std::string>();
+    const json* card = FindByName(ArrayAt(network, "pnics"), pnic);
+    if (card != nullptr && card->value("linkUp", false) &&
+        SwitchOfUplink(state, pnic) == StringAt(*vswitch, "name")) {
+      return true;
+    }
+  }
+  return false;
 }
 
 IpConfig ReadIpConfig(const json& nic) {

@@ -50,6 +50,24 @@ void RequireStack(const std::string& stack);
 /// The switch that uses `pnic` as an uplink; empty when none.
 std::string SwitchOfUplink(const json& state, std::string_view pnic);
 
+/// Whether two address texts name the same address, compared by value
+/// with any "%zone" ignored ("fe80::01%hyk0" and "fe80::1" match); texts
+/// that are not addresses compare as they are.
+bool SameIpAddress(const std::string& a, const std::string& b);
+
+/// Whether `address` is in the state's "network.reachable" list.
+bool IsReachable(const json& state, const std::string& address);
+
+/// The port `id` of the distributed switch `vswitch` (an element of
+/// "network.switches"), or null.
+const json* FindDvsPort(const json& vswitch, std::string_view id);
+
+/// Whether traffic of kernel NIC `name` reaches the physical network: the
+/// NIC exists and is in service, and it is attached to a portgroup, an
+/// opaque network, or a distributed-switch port that is not blocked and
+/// uses at least one of the switch's uplinks whose link is up.
+bool KernelNicCarriesTraffic(const json& state, std::string_view name);
+
 /// A kernel NIC's IP configuration as the API presents it.
 HostMgr::Network::IpConfig ReadIpConfig(const json& nic);
 /// Writes `config` into a kernel NIC's state (see HykNicImpl::SetIpConfig).

@@ -273,7 +273,9 @@ void CheckNetwork(const json* network) {
                {"dns", Type::kObject},
                {"routing", Type::kObject},
                {"reachable", Type::kArray},
-               {"dhcpOffer", Type::kObject}})) {
+               {"dhcpOffer", Type::kObject},
+               {"dnsRecords", Type::kObject},
+               {"resolverDelayMs", Type::kInteger}})) {
     return;
   }
   Fields(Member(network, "dhcpOffer"), at + ".dhcpOffer",
@@ -306,7 +308,9 @@ void CheckNetwork(const json* network) {
                      {"mtu", Type::kInteger},
                      {"uplinks", Type::kArray},
                      {"teaming", Type::kObject},
-                     {"portGroups", Type::kArray}});
+                     {"portGroups", Type::kArray},
+                     {"thirdParty", Type::kBoolean},
+                     {"ports", Type::kArray}});
              if (const json* type = Member(&vswitch, "type")) {
                if (*type != "standard" && *type != "distributed") {
                  Fail(path + ".type must be \"standard\" or \"distributed\"");
@@ -314,6 +318,16 @@ void CheckNetwork(const json* network) {
              }
              Elements(&vswitch, path, "uplinks", Type::kString, Nothing);
              Elements(&vswitch, path, "portGroups", Type::kString, Nothing);
+             Elements(&vswitch, path, "ports", Type::kObject,
+                      [](const json& port, const std::string& portPath) {
+                        Fields(&port, portPath,
+                               {{"id", Type::kString, true},
+                                {"vlanId", Type::kInteger},
+                                {"uplinks", Type::kArray},
+                                {"blocked", Type::kBoolean},
+                                {"hostLocal", Type::kBoolean}});
+                        Elements(&port, portPath, "uplinks", Type::kString, Nothing);
+                      });
              CheckTeaming(Member(&vswitch, "teaming"), path + ".teaming");
            });
   Elements(network, at, "portGroups", Type::kObject,
@@ -342,6 +356,12 @@ void CheckNetwork(const json* network) {
   Fields(Member(network, "routing"), at + ".routing",
          {{"ipv4Gateway", Type::kIpv4}, {"ipv6Gateway", Type::kIpv6}});
   Elements(network, at, "reachable", Type::kString, Nothing);
+  Values(network, at, "dnsRecords", Type::kArray,
+         [](const json& addresses, const std::string& path) {
+           for (std::size_t i = 0; i < addresses.size(); ++i) {
+             Expect(addresses[i], path + "[" + std::to_string(i) + "]", Type::kIp);
+           }
+         });
 }
 
 void CheckSystem(const json* system) {

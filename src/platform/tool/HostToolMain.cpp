@@ -61,7 +61,7 @@ std::string SelfPath(const char* argv0) {
 
 int Usage() {
   std::fprintf(stderr,
-               "usage: tulk-hosttool --install <root> | --demo-state | --as <tool> [args]\n"
+               "usage: tulk-hosttool --install <root> | --demo-state [dvs] | --as <tool> [args]\n"
                "       or run under a tool's name (tavcli, osk-cmd, reboot, ...)\n");
   return 2;
 }
@@ -93,6 +93,10 @@ int main(int argc, char** argv) {
     }
     if (args.size() == 1 && args[0] == "--demo-state") {
       std::printf("%s\n", Sim::DemoHostState().dump(2).c_str());
+      return 0;
+    }
+    if (args.size() == 2 && args[0] == "--demo-state" && args[1] == "dvs") {
+      std::printf("%s\n", Sim::DistributedSwitchDemoHostState().dump(2).c_str());
       return 0;
     }
     if (args.size() >= 2 && args[0] == "--as") {

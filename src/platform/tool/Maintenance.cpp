@@ -4,25 +4,10 @@
 
 #include <fstream>
 
-#include "platform/api/IpAddress.h"
 #include "platform/sim/SimHost.h"
 #include "platform/sim/SimState.h"
 
 namespace Sim::Tools {
-namespace {
-
-std::string WithoutZone(const std::string& address) {
-  return address.substr(0, address.find('%'));
-}
-
-// Compares addresses by value, so that "fe80::01" matches "fe80::1".
-bool SameAddress(const std::string& a, const std::string& b) {
-  auto x = HostMgr::Network::IpAddress::Parse(WithoutZone(a));
-  auto y = HostMgr::Network::IpAddress::Parse(WithoutZone(b));
-  return x != nullptr && y != nullptr ? *x == *y : WithoutZone(a) == WithoutZone(b);
-}
-
-}  // namespace
 
 int Ping(ToolRun& run) {
   const std::vector<std::string>& args = run.Args();
@@ -58,10 +43,11 @@ int Ping(ToolRun& run) {
       return 1;
     }
   }
-  bool reachable = false;
-  for (const json& known : ArrayAt(network, "reachable")) {
-    reachable = reachable || SameAddress(known.get<std::string>(), address);
-  }
+  // Through an interface whose port passes no traffic (a blocked
+  // distributed-switch port, or one without a working uplink) nothing
+  // answers.
+  const bool reachable = IsReachable(state, address) &&
+                         (interface.empty() || KernelNicCarriesTraffic(state, interface));
   run.Out("PING " + address + ": 56 data bytes\n");
   if (reachable) {
     run.Out("\n--- " + address + " ping statistics ---\n" + count + " packets transmitted, " +
