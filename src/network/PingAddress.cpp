@@ -5,8 +5,8 @@
 
 namespace Tulk {
 
-void PingAddress(std::string interfaceName, std::string address,
-                 std::shared_ptr<WorkerResult> result) {
+void PingAddress(const std::string& interfaceName, const std::string& address,
+                 const std::shared_ptr<WorkerResult>& result) {
   result->Set(RunHostCommandLine(PingCommand(interfaceName, address)));
 }
 

@@ -12,7 +12,7 @@ namespace Tulk {
 /// execution and stores its exit status in `result` (0: the address
 /// answered; -1 stands for a program that could not run, stored as -2).
 /// Meant for a detached thread: it shares only `result` with the screen.
-void PingAddress(std::string interfaceName, std::string address,
-                 std::shared_ptr<WorkerResult> result);
+void PingAddress(const std::string& interfaceName, const std::string& address,
+                 const std::shared_ptr<WorkerResult>& result);
 
 }  // namespace Tulk

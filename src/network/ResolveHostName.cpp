@@ -16,7 +16,7 @@ std::mutex& HostsFileEdit() {
 
 }  // namespace
 
-void ResolveHostName(std::string hostName, std::shared_ptr<WorkerResult> result) {
+void ResolveHostName(const std::string& hostName, const std::shared_ptr<WorkerResult>& result) {
   bool resolved = false;
   {
     std::lock_guard<std::mutex> editing(HostsFileEdit());

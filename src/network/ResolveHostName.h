@@ -26,6 +26,6 @@ namespace Tulk {
 /// - A console that ends between backup and restore leaves the backup; the
 ///   next start puts it back (RecoverHostsFile()).
 /// Meant for a detached thread: it shares only `result` with the screen.
-void ResolveHostName(std::string hostName, std::shared_ptr<WorkerResult> result);
+void ResolveHostName(const std::string& hostName, const std::shared_ptr<WorkerResult>& result);
 
 }  // namespace Tulk

@@ -19,6 +19,7 @@ std::vector<StandardSwitchInfo> ReadStandardSwitches() {
   std::vector<SwitchSummary> summaries;
   GetStandardSwitchList(summaries);
   std::vector<StandardSwitchInfo> switches;
+  switches.reserve(summaries.size());
   for (SwitchSummary& summary : summaries) {
     switches.emplace_back(std::move(summary));
   }
