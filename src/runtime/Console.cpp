@@ -44,8 +44,14 @@ void EndWindowAtExit() {
   }
 }
 
+// An unknown or empty TERM: curses cannot start, and its own message would
+// go to the silenced standard error.
 void StartCurses() {
-  initscr();
+  if (newterm(nullptr, stdout, stdin) == nullptr) {
+    const char* term = std::getenv("TERM");
+    Log(LOG_ERR, "Error opening terminal: %s.", term != nullptr ? term : "");
+    std::exit(1);
+  }
   start_color();
   std::atexit(EndWindowAtExit);
   curs_set(0);

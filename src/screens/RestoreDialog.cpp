@@ -20,7 +20,8 @@ constexpr char kResetScript[] = "/sbin/firmwareConfig.py";
 
 [[noreturn]] void WaitForHostToGoDown() {
   for (;;) {
-    if (PollInput(nullptr) == kPollTerminate) {
+    const int result = PollInput(nullptr);
+    if (result == kPollTerminate || result == kPollHangUp) {
       std::exit(0);
     }
   }
