@@ -52,7 +52,7 @@ int RestoreDialog::Run() {
     SetText(Text(TextId::kResetWait));
   }
   const std::string reset = ShellQuote(HostPath(kResetScript)) + " --reset-only > /dev/null 2>&1";
-  if (RunShellCommand(reset) != 0) {
+  if (RunShellCommand(reset, kResetTimeoutSeconds) != 0) {
     return 0;
   }
 
@@ -63,7 +63,7 @@ int RestoreDialog::Run() {
     SetText(Text(TextId::kResetDone));
   }
   WaitForEnter();
-  if (RunShellCommand("reboot -f") == -1) {
+  if (RunShellCommand("reboot -f", kPowerCommandTimeoutSeconds) == -1) {
     return 0;
   }
   WaitForHostToGoDown();
