@@ -56,9 +56,11 @@
 ///   (it opens a window, like entries 7 and 13); entry 11's footer shows
 ///   the page hints "<Page Up> <Page Down>" in light grey on the left.
 /// - After a screen opened with Enter returns, the window is shown again
-///   with the same entry selected (when that entry is still enabled, else
-///   the first entry). Enter on entries 11 and 12 does nothing and redraws
-///   nothing.
+///   from the first entry, as when it was opened. Enter on entries 11 and
+///   12 does nothing and redraws nothing.
+/// - SIGUSR1 rebuilds the entries but keeps the selected one (when it can
+///   still be chosen, else the first): a reload the operator did not ask
+///   for should not move the selection under their hands.
 
 #include <cstdint>
 #include <string>
