@@ -173,18 +173,22 @@ TEST(Ending, LostTerminalEndsTheConsoleWithStatusZero) {
   struct Case {
     const char* name;
     Input input;
+    // Null: the input has ended before the console starts (it may be gone
+    // before its screen is read).
     void (*loseIt)(LoneConsole&);
   };
   const Case cases[] = {
       {"pseudo-terminal closed", Input::kTerminal, [](LoneConsole& c) { c.CloseTerminal(); }},
       {"input pipe closed", Input::kPipe, [](LoneConsole& c) { c.CloseInput(); }},
-      {"input at the end of /dev/null", Input::kDevNull, [](LoneConsole&) {}},
+      {"input at the end of /dev/null", Input::kDevNull, nullptr},
   };
   for (const Case& c : cases) {
     SCOPED_TRACE(c.name);
     LoneConsole console(c.input);
-    ASSERT_TRUE(console.WaitForText("KEYECHO active"));
-    c.loseIt(console);
+    if (c.loseIt != nullptr) {
+      ASSERT_TRUE(console.WaitForText("KEYECHO active"));
+      c.loseIt(console);
+    }
     EXPECT_EQ(console.WaitExit(), 0);
     EXPECT_TRUE(console.Logged("<14>Terminal hung up"));
   }
