@@ -215,12 +215,14 @@ void SimHost::Modify(const std::function<void(nlohmann::json&)>& change) {
   std::lock_guard guard(mutex_);
   EnsureLoaded();
   StateLock lock(path_);
-  if (FileChanged()) {
-    try {
-      ReadFile();
-    } catch (const StateError& error) {
-      throw HostMgr::Lib::HostMgrException(error.what());
-    }
+  // Under the lock the file is read again whatever its stamp says: a file
+  // system that reuses inode numbers at once and keeps coarse times can
+  // give another writer's file the very stamp of this one's last write,
+  // and the change would then be applied to a stale copy.
+  try {
+    ReadFile();
+  } catch (const StateError& error) {
+    throw HostMgr::Lib::HostMgrException(error.what());
   }
   nlohmann::json next = snapshot_->state;
   change(next);

@@ -18,9 +18,11 @@
 /// written back at once and atomically (temporary file, fsync, rename): the
 /// console and the tools may change the file concurrently without losing
 /// an update, a change is seen by the next run, and a crash never leaves a
-/// half-written file. Reads re-read the file only when it was replaced
-/// (device, inode, size and modification time are compared), so a query
-/// on an unchanged state costs one stat().
+/// half-written file. A change always reads the file again under the lock
+/// (a stamp can repeat: inode numbers are reused and times are coarse).
+/// Reads re-read the file only when it was replaced (device, inode, size
+/// and modification time are compared), so a query on an unchanged state
+/// costs one stat().
 ///
 /// Threads: the console's worker threads (the network test, the live core
 /// capture) run host programs and edit the hosts file while the main
