@@ -13,6 +13,8 @@
 #include <algorithm>
 #include <cerrno>
 #include <chrono>
+#include <cmath>
+#include <cstdlib>
 #include <optional>
 #include <string_view>
 #include <utility>
@@ -249,7 +251,9 @@ std::optional<pid_t> Spawn(const std::string& program, const std::vector<std::st
   sigfillset(&all);
   posix_spawnattr_setsigmask(attributes.Get(), &none);
   posix_spawnattr_setsigdefault(attributes.Get(), &all);
-  posix_spawnattr_setflags(attributes.Get(), POSIX_SPAWN_SETSIGMASK | POSIX_SPAWN_SETSIGDEF);
+  posix_spawnattr_setpgroup(attributes.Get(), 0);
+  posix_spawnattr_setflags(attributes.Get(),
+                           POSIX_SPAWN_SETSIGMASK | POSIX_SPAWN_SETSIGDEF | POSIX_SPAWN_SETPGROUP);
 
   std::string path = ResolveProgram(program);
   std::vector<std::string> argumentCopy = arguments;
@@ -269,6 +273,23 @@ std::optional<pid_t> Spawn(const std::string& program, const std::vector<std::st
     return std::nullopt;
   }
   return pid;
+}
+
+double ReadLimitScale() {
+  const char* text = std::getenv("TULK_COMMAND_TIME_SCALE");
+  if (text == nullptr || *text == '\0') {
+    return 1.0;
+  }
+  char* end = nullptr;
+  const double scale = std::strtod(text, &end);
+  return end != text && scale > 0.0 ? scale : 1.0;
+}
+
+// The real time a limit of `seconds` lasts (TULK_COMMAND_TIME_SCALE).
+std::chrono::milliseconds LimitDuration(int seconds) {
+  static const double scale = ReadLimitScale();
+  return std::chrono::milliseconds(
+      static_cast<std::int64_t>(std::ceil(std::max(seconds, 0) * 1000.0 / scale)));
 }
 
 // A descriptor that becomes readable when the child exits, so the poll
@@ -360,6 +381,7 @@ std::optional<int> WaitForChild(pid_t pid, int timeoutSeconds, SteadyClock::time
     }
     if (SteadyClock::now() >= deadline) {
       Log(LOG_WARNING, "Killing process because %d seconds timeout expired", timeoutSeconds);
+      kill(-pid, SIGKILL);
       kill(pid, SIGKILL);
       ReapBriefly(pid, pidfd.Get());
       return std::nullopt;
@@ -406,7 +428,7 @@ int Run(const std::string& program, const std::vector<std::string>& arguments, c
   if (!pid) {
     return -1;
   }
-  SteadyClock::time_point deadline = SteadyClock::now() + std::chrono::seconds(timeoutSeconds);
+  SteadyClock::time_point deadline = SteadyClock::now() + LimitDuration(timeoutSeconds);
   in.read.Close();
   out.pipe.write.Close();
   err.pipe.write.Close();
@@ -443,24 +465,24 @@ int RunCommand(const std::string& program, const std::vector<std::string>& argum
   }
 }
 
-int RunShellCommand(const std::string& commandLine) noexcept {
+int RunShellCommand(const std::string& commandLine, int timeoutSeconds) noexcept {
   try {
     return RunCommand("/bin/sh", {"sh", "-c", commandLine}, nullptr, nullptr, nullptr, nullptr,
-                      nullptr, 0, 0);
+                      nullptr, 0, timeoutSeconds);
   } catch (const std::exception&) {
     return -1;
   }
 }
 
 int RunLoggedCommand(const std::string& program, const std::vector<std::string>& arguments,
-                     const std::vector<std::string>* environment) noexcept {
+                     const std::vector<std::string>* environment, int timeoutSeconds) noexcept {
   try {
     char output[kCaptureBufferSize];
     char error[kCaptureBufferSize];
     std::int32_t outputLength = kCaptureBufferSize;
     std::int32_t errorLength = kCaptureBufferSize;
     int rc = RunCommand(program, arguments, output, &outputLength, error, &errorLength, nullptr, 0,
-                        0, environment);
+                        timeoutSeconds, environment);
     std::string command = CommandText(arguments);
     if (rc != 0) {
       Log(LOG_ERR, "Command \"%s\" failed (rc=%d): (stdout=%s, stderr=%s)", command.c_str(), rc,

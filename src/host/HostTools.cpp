@@ -38,11 +38,11 @@ std::string ConsoleUser() {
   return currentUser.empty() ? std::string(kOskFallbackUser) : currentUser;
 }
 
-int RunTavcli(const std::vector<std::string>& arguments) {
+int RunTavcli(const std::vector<std::string>& arguments, int timeoutSeconds) {
   char output[kCaptureBufferSize];
   std::int32_t outputLength = kCaptureBufferSize;
-  int rc =
-      RunCommand("/bin/tavcli", arguments, output, &outputLength, nullptr, nullptr, nullptr, 0, 0);
+  int rc = RunCommand("/bin/tavcli", arguments, output, &outputLength, nullptr, nullptr, nullptr, 0,
+                      timeoutSeconds);
   LogOutcome(arguments, rc, output);
   return rc;
 }
@@ -53,12 +53,13 @@ int RunStandardSwitchCommand(const std::vector<std::string>& subcommandAndOption
   return RunTavcli(arguments);
 }
 
-int RunOskCmd(std::vector<std::string> arguments, std::string* output) {
+int RunOskCmd(std::vector<std::string> arguments, std::string* output, int timeoutSeconds) {
   char out[kCaptureBufferSize];
   char err[kCaptureBufferSize];
   std::int32_t outLength = kCaptureBufferSize;
   std::int32_t errLength = kCaptureBufferSize;
-  int rc = RunCommand("/bin/osk-cmd", arguments, out, &outLength, err, &errLength, nullptr, 0, 0);
+  int rc = RunCommand("/bin/osk-cmd", arguments, out, &outLength, err, &errLength, nullptr, 0,
+                      timeoutSeconds);
   if (rc == kOskUnusableUser && arguments.size() > kOskUserIndex) {
     std::vector<std::string> command(arguments.begin() + kOskUserIndex + 1, arguments.end());
     Log(LOG_INFO, "Unable to execute command osk-cmd %s using user %s. Using user %s",
@@ -66,7 +67,8 @@ int RunOskCmd(std::vector<std::string> arguments, std::string* output) {
     arguments[kOskUserIndex] = kOskFallbackUser;
     outLength = kCaptureBufferSize;
     errLength = kCaptureBufferSize;
-    rc = RunCommand("/bin/osk-cmd", arguments, out, &outLength, err, &errLength, nullptr, 0, 0);
+    rc = RunCommand("/bin/osk-cmd", arguments, out, &outLength, err, &errLength, nullptr, 0,
+                    timeoutSeconds);
   }
   LogOutcome(arguments, rc, rc != 0 && outLength == 0 ? err : out);
   if (output != nullptr) {
@@ -82,7 +84,7 @@ int RunOskCommand(const std::string& command) {
 int RunOskCmdGet(const std::string& path, std::string& value) {
   Log(LOG_INFO, "osk-cmd invocation: get %s", path.c_str());
   std::string output;
-  int rc = RunOskCmd({"osk-cmd", "-U", ConsoleUser(), "get", path}, &output);
+  int rc = RunOskCmd({"osk-cmd", "-U", ConsoleUser(), "get", path}, &output, kQueryTimeoutSeconds);
   value = Trimmed(output);
   return rc;
 }
@@ -93,12 +95,13 @@ bool OskCmdGetFlag(const std::string& path) {
 }
 
 int PowerOffVirtualMachines(bool graceful) {
-  RunOskCommand("hostsvc/autostartmanager/autostop");
+  RunOskCmd({"osk-cmd", "-U", ConsoleUser(), "hostsvc/autostartmanager/autostop"}, nullptr,
+            kPowerOffVmsTimeoutSeconds);
   std::vector<std::string> arguments = {"powerOffVms"};
   if (!graceful) {
     arguments.emplace_back("--terminate");
   }
-  return RunLoggedCommand("/bin/powerOffVms", arguments);
+  return RunLoggedCommand("/bin/powerOffVms", arguments, nullptr, kPowerOffVmsTimeoutSeconds);
 }
 
 bool SetAdvancedOption(const std::string& path, std::int64_t value) {

@@ -2,12 +2,15 @@
 /// Wrappers for the host's command-line tools: the management tool
 /// "tavcli", the management-API tool "osk-cmd", the power-off of the
 /// virtual machines and the advanced options. Each builds its command line,
-/// runs it through the command runner (host/CommandRunner.h) and logs the
-/// outcome. None of them throws.
+/// runs it through the command runner (host/CommandRunner.h) within the
+/// time limit its kind of work gets there, and logs the outcome. None of
+/// them throws.
 
 #include <cstdint>
 #include <string>
 #include <vector>
+
+#include "host/CommandRunner.h"
 
 namespace Tulk {
 
@@ -22,10 +25,12 @@ inline constexpr char kOskFallbackUser[] = "root";
 std::string ConsoleUser();
 
 /// Runs "/bin/tavcli" with `arguments` (arguments[0] is "tavcli"),
-/// capturing up to 255 bytes of output, and logs "Command \"%s\" failed
-/// (rc=%d): %s" (with the output) at error level or "Command \"%s\"
-/// succeeded" at info level. Returns the exit code.
-int RunTavcli(const std::vector<std::string>& arguments);
+/// capturing up to 255 bytes of output, limited to `timeoutSeconds`, and
+/// logs "Command \"%s\" failed (rc=%d): %s" (with the output) at error
+/// level or "Command \"%s\" succeeded" at info level. Returns the exit
+/// code.
+int RunTavcli(const std::vector<std::string>& arguments,
+              int timeoutSeconds = kChangeTimeoutSeconds);
 
 /// A standard-switch command: "tavcli", "network", "vswitch", "standard",
 /// then `subcommandAndOptions` (for example "portgroup", "add", "-p",
@@ -40,8 +45,10 @@ int RunStandardSwitchCommand(const std::vector<std::string>& subcommandAndOption
 /// kOskFallbackUser in place of the user and runs it once more; it never
 /// runs more than twice. The outcome of the last run is logged like
 /// RunTavcli(). `output`, when given, receives the captured output of the
-/// last run. Returns the exit code of the last run.
-int RunOskCmd(std::vector<std::string> arguments, std::string* output = nullptr);
+/// last run. Each run is limited to `timeoutSeconds`; a run killed by it
+/// (-1) is not retried. Returns the exit code of the last run.
+int RunOskCmd(std::vector<std::string> arguments, std::string* output = nullptr,
+              int timeoutSeconds = kChangeTimeoutSeconds);
 
 /// "osk-cmd", "-U", ConsoleUser(), `command` through RunOskCmd(); for
 /// example "internalsvc/refresh" after network changes.
@@ -49,8 +56,9 @@ int RunOskCommand(const std::string& command);
 
 /// The "get" form of the management-API tool: logs "osk-cmd invocation: get
 /// %s" with `path` at info level, runs "osk-cmd", "-U", ConsoleUser(),
-/// "get", `path` and stores the printed value (without surrounding white
-/// space) in `value`. Returns the exit code.
+/// "get", `path` (a read: kQueryTimeoutSeconds) and stores the printed
+/// value (without surrounding white space) in `value`. Returns the exit
+/// code.
 int RunOskCmdGet(const std::string& path, std::string& value);
 
 /// True when the "get" of `path` succeeds and prints "true" (for example
@@ -60,8 +68,9 @@ bool OskCmdGetFlag(const std::string& path);
 /// Powers off the virtual machines before a shutdown or restart: runs
 /// "osk-cmd", "-U", ConsoleUser(), "hostsvc/autostartmanager/autostop",
 /// then "/bin/powerOffVms" ("powerOffVms", plus "--terminate" unless
-/// `graceful`: running machines are then forcefully terminated). Both runs
-/// are logged by the runner. Returns the exit code of "powerOffVms".
+/// `graceful`: running machines are then forcefully terminated), each
+/// limited to kPowerOffVmsTimeoutSeconds. Both runs are logged by the
+/// runner. Returns the exit code of "powerOffVms".
 int PowerOffVirtualMachines(bool graceful);
 
 /// Sets an integer advanced option: runs "/sbin/tavcli" with "tavcli",

@@ -48,7 +48,7 @@ bool StopOpsAgent() {
 bool IsOpsAgentPresent() {
   bool present = access(HostPath(kInitScript).c_str(), F_OK) == 0 &&
                  RunCommand(kInitScript, {kInitScript, "status"}, nullptr, nullptr, nullptr,
-                            nullptr, nullptr, 0, 0) == 0;
+                            nullptr, nullptr, 0, kQueryTimeoutSeconds) == 0;
   Log(LOG_INFO, "zyo-opsagent is %spresent on the system.", present ? "" : "not ");
   return present;
 }
@@ -63,7 +63,7 @@ bool StartOpsAgentIfPresent() {
 
 bool IsOpsAgentVersion3OrLater() {
   Log(LOG_INFO, "Running: %s", kVersionCommand);
-  if (RunShellCommand(kVersionCommand) != 0) {
+  if (RunShellCommand(kVersionCommand, kPackageQueryTimeoutSeconds) != 0) {
     return false;
   }
   Log(LOG_INFO, "zyo-opsagent version >= 3 detected");

@@ -2,7 +2,10 @@
 /// The operations agent of the network-overlay product ("zyo-opsagent"):
 /// start, stop and presence through its init script
 /// "/etc/init.d/zyo-opsagent", and the test of its installed major version.
-/// Every step is logged; nothing throws.
+/// Every step is logged; nothing throws. Start and stop are limited to
+/// kChangeTimeoutSeconds, the status to kQueryTimeoutSeconds and the version
+/// test to kPackageQueryTimeoutSeconds (host/CommandRunner.h); a script
+/// killed by its limit counts as failed (or as an absent agent).
 
 namespace Tulk {
 

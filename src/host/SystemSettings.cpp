@@ -47,11 +47,22 @@ bool WriteKeyboardLayout(const std::string& layout, std::string& error) {
 }
 
 std::string ReadWelcomeMessage() {
-  return HykCtl::System::SystemInfoImpl().GetWelcomeMessage();
+  try {
+    return HykCtl::System::SystemInfoImpl().GetWelcomeMessage();
+  } catch (const HostMgrException& error) {
+    Log(LOG_ERR, "Getting welcome message failed: %s", error.what());
+    return {};
+  }
 }
 
-void RaiseSystemAlert(const std::string& text) {
-  HykCtl::System::SystemInfoImpl().SetSystemAlert(text);
+bool RaiseSystemAlert(const std::string& text) {
+  try {
+    HykCtl::System::SystemInfoImpl().SetSystemAlert(text);
+    return true;
+  } catch (const HostMgrException& error) {
+    Log(LOG_ERR, "Setting system alert failed: %s", error.what());
+    return false;
+  }
 }
 
 bool HasNetworkBootOption() {

@@ -31,13 +31,15 @@ KeyboardLayouts ReadKeyboardLayouts();
 bool WriteKeyboardLayout(const std::string& layout, std::string& error);
 
 /// The administrator's welcome message (empty for the standard summary).
-/// A host-control failure passes to the caller as
-/// HostMgr::Lib::HostMgrException: the welcome screen decides.
+/// A message that cannot be read is logged as "Getting welcome message
+/// failed: %s" at error level and gives the empty text, so that the welcome
+/// screen shows its standard summary.
 std::string ReadWelcomeMessage();
 
-/// Raises the system alert `text` once more on the host. A failure passes
-/// to the caller like ReadWelcomeMessage().
-void RaiseSystemAlert(const std::string& text);
+/// Raises the system alert `text` once more on the host. Returns false when
+/// the host refused it (logged as "Setting system alert failed: %s" at
+/// error level).
+bool RaiseSystemAlert(const std::string& text);
 
 /// Whether the "PXEBootEnabled" advanced option exists (the host was booted
 /// from the network); false when the question fails.

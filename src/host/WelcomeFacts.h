@@ -41,16 +41,31 @@ struct WelcomeFacts {
   /// Processor packages and the model name as the CPU reports it.
   int cpuPackages = 0;
   std::string cpuModel;
-  /// Installed memory in bytes (total pages x page size).
+  /// Installed memory in bytes (total pages x page size); 0 when unknown.
   std::uint64_t memoryBytes = 0;
 };
 
-/// Reads the facts from the host. The management NIC comes from the host
-/// layer's query (a host without one, or a failing lookup, leaves the
-/// address fields at their defaults: not DHCP, IPv4 on, 0.0.0.0, no IPv6
-/// addresses). Every other host-control failure passes to the caller as
-/// HostMgr::Lib::HostMgrException: the welcome screen has no sensible
-/// state without the host, and the exception ends the console's run.
+/// Reads the facts from the host. Nothing throws: the welcome screen shows
+/// what can be read. Each query that fails with the host-control exception
+/// logs one line at error level and leaves its filler:
+///
+/// | Query | Line | Filler |
+/// |---|---|---|
+/// | management NIC (host layer) | "Getting management interface failed: %s" | no NIC: not DHCP,
+/// IPv4 on, 0.0.0.0, no IPv6 | | its IP configuration | "Getting management IP configuration
+/// failed: %s" | as without a NIC | | the kernel's IPv6 state | "Getting IPv6 state failed: %s" |
+/// off | | host name (host layer) | "Getting host name failed: %s" | empty (no name line) | |
+/// physical NICs | "Getting physical nics failed: %s" | present | | boot option | "Getting boot
+/// option failed: %s" | not audit mode | | vendor | "Getting vendor name failed: %s" | empty | |
+/// product | "Getting product name failed: %s" | "N/A" | | processor packages | "Getting processor
+/// packages failed: %s" | 0 | | processor model | "Getting processor model failed: %s" | "N/A" | |
+/// memory pages, page size | "Getting memory size failed: %s" | 0 (shown as "N/A") |
+///
+/// Decisions of this implementation: a failing NIC list counts as NICs
+/// present, so that the screen neither claims that the host has no adapter
+/// nor raises that alert on the host when it only could not ask; a boot
+/// option that cannot be read (a non-zero status or the exception) is not
+/// audit mode.
 WelcomeFacts ReadWelcomeFacts();
 
 }  // namespace Tulk

@@ -3,6 +3,7 @@
 #include <curses.h>
 #include <fcntl.h>
 #include <syslog.h>
+#include <term.h>
 #include <unistd.h>
 #include <clocale>
 #include <cstdlib>
@@ -44,8 +45,24 @@ void EndWindowAtExit() {
   }
 }
 
+[[noreturn]] void TerminalUnusable() {
+  const char* term = std::getenv("TERM");
+  Log(LOG_ERR, "Error opening terminal: %s.", term != nullptr ? term : "");
+  std::exit(1);
+}
+
+// An unknown or empty TERM: curses cannot start, and its own message would
+// go to the silenced standard error. The type is tried on its own first: a
+// failed newterm() loses memory that a failed setupterm() does not.
 void StartCurses() {
-  initscr();
+  int error = 0;
+  if (setupterm(nullptr, STDOUT_FILENO, &error) != OK) {
+    TerminalUnusable();
+  }
+  del_curterm(cur_term);
+  if (newterm(nullptr, stdout, stdin) == nullptr) {
+    TerminalUnusable();
+  }
   start_color();
   std::atexit(EndWindowAtExit);
   curs_set(0);

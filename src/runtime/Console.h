@@ -32,7 +32,10 @@ struct ConsoleHooks {
 };
 
 /// Runs the console: start-up steps 1 to 14, the welcome screen, teardown.
-/// Returns 0; most endings are exit(0) calls from the key loop.
+/// Returns 0; most endings are exit(0) calls from the key loop. A terminal
+/// type that curses cannot use (an unknown or empty TERM) ends the start-up
+/// with exit status 1 and the error line "Error opening terminal: %s." in
+/// the system log, since standard error is silenced by then.
 int ConsoleMain(int argc, char** argv, const ConsoleHooks& hooks);
 
 }  // namespace Tulk

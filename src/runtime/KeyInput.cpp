@@ -8,6 +8,7 @@
 
 #include <cerrno>
 #include <cstdlib>
+#include <ctime>
 
 #include "include/Constants.h"
 #include "include/ProcessFlags.h"
@@ -34,6 +35,21 @@ int ReadKeyNow() {
   nodelay(stdscr, FALSE);
   g_cursesMayHoldInput = key != ERR;
   return key;
+}
+
+// Standard input reported readable but gave no key: it has reached its end
+// (a hung-up terminal reads 0 bytes or fails with EIO) unless bytes are
+// still waiting. A descriptor that cannot be asked (/dev/null) counts as
+// ended.
+bool InputAtEnd() {
+  int waiting = 0;
+  return ioctl(0, FIONREAD, &waiting) != 0 || waiting <= 0;
+}
+
+// A poll() that keeps failing must not turn the key loop into a busy loop.
+void PauseAfterPollFailure() {
+  timespec pause{0, 100 * 1000 * 1000};
+  nanosleep(&pause, nullptr);
 }
 
 bool IsLater(const timeval& a, const timeval& b) {
@@ -71,24 +87,24 @@ int PollInput(const timeval* limit, int wakeFd) {
   }
   if (ready < 0) {
     LogErrno("poll() failed");
+    if (errno != EINTR) {
+      PauseAfterPollFailure();
+    }
     return kPollOther;
   }
   if (ready == 0) {
     return kPollTimeLimit;
   }
-  if ((fds[0].revents & (POLLIN | POLLHUP | POLLERR)) != 0) {
-    return ReadKeyNow();
+  if ((fds[0].revents & (POLLHUP | POLLERR | POLLNVAL)) != 0) {
+    return kPollHangUp;
+  }
+  if ((fds[0].revents & POLLIN) != 0) {
+    const int key = ReadKeyNow();
+    return key == ERR && InputAtEnd() ? kPollHangUp : key;
   }
   if ((fds[1].revents & POLLIN) != 0) {
-    unsigned char code = 0;
-    ssize_t got;
-    do {
-      got = read(fds[1].fd, &code, 1);
-    } while (got < 0 && errno == EINTR);
-    if (got == 1 && code >= 1 && code <= 4) {
-      return -2 - code;
-    }
-    return kPollOther;
+    const int code = ReadSignalCode();
+    return code >= 1 && code <= 4 ? -2 - code : kPollOther;
   }
   if (count == 3 && (fds[2].revents & (POLLIN | POLLHUP | POLLERR)) != 0) {
     return kPollWoken;
@@ -125,6 +141,9 @@ int WaitFor(RuntimeFrame* frame, bool idleTimeout, const WorkerResult* workerRes
   const int wakeFd = workerResult != nullptr ? workerResult->WakeFd() : -1;
 
   for (;;) {
+    if (TakeBrokenPipe()) {
+      std::exit(0);
+    }
     const timeval now = Clock::Now();
     if (timeoutActive && IsLater(now, deadline)) {
       currentWindow = nullptr;
@@ -178,6 +197,9 @@ int WaitFor(RuntimeFrame* frame, bool idleTimeout, const WorkerResult* workerRes
         HandleResize();
         std::exit(0);
       case kPollTerminate:
+        std::exit(0);
+      case kPollHangUp:
+        Log(LOG_INFO, "Terminal hung up");
         std::exit(0);
       default:
         break;

@@ -28,6 +28,7 @@ inline constexpr int kPollExitAfter = -4;  // SIGUSR2
 inline constexpr int kPollResize = -5;     // SIGWINCH
 inline constexpr int kPollTerminate = -6;  // SIGINT, SIGQUIT, SIGTERM
 inline constexpr int kPollWoken = -7;      // the wake descriptor is readable
+inline constexpr int kPollHangUp = -8;     // standard input hung up or ended
 
 /// WaitForKeyOrResult(): the worker's result is set.
 inline constexpr int kKeyResultReady = kPollWoken;
@@ -41,13 +42,21 @@ inline constexpr long kDimSeconds = 60;
 /// that descriptor is readable (a key or a signal byte that is ready too
 /// comes first); the byte is left for its owner. Before a wait that can
 /// block, a test harness is told that the console is ready (ReadySignal.h).
+///
+/// kPollHangUp: standard input hung up (POLLHUP, POLLERR, POLLNVAL), or it
+/// was reported readable and gave no key with nothing left to read (a read
+/// of 0 bytes or EIO). A poll() that fails other than by EINTR is logged
+/// and followed by a pause of 100 ms, so that no failure can make the key
+/// loop spin.
 int PollInput(const timeval* limit, int wakeFd = -1);
 
 /// Returns the next key for `frame`. With `idleTimeout` true and a
 /// configured timeout, throws TulkTimeout after that many seconds without a
 /// key (at least one minute). Dims the frame after a minute; the key that
 /// wakes it is delivered. Ends the process with exit(0) on SIGUSR2 outside
-/// a session, on a resize and on SIGINT, SIGQUIT or SIGTERM.
+/// a session, on a resize, on SIGINT, SIGQUIT, SIGTERM, SIGHUP or SIGPIPE,
+/// and when the terminal hangs up (logged as "Terminal hung up"): the
+/// console cannot be used any more, and a restart gets a new terminal.
 int WaitForKey(RuntimeFrame* frame, bool idleTimeout);
 
 /// WaitForKey(), but it also returns kKeyResultReady as soon as `result`

@@ -2,10 +2,14 @@
 
 #include <fcntl.h>
 #include <signal.h>
+#include <sys/stat.h>
 #include <syslog.h>
 #include <unistd.h>
 
-#include <cstdio>
+#include <cctype>
+#include <cerrno>
+#include <cstdlib>
+#include <limits>
 #include <string>
 
 #include "include/Constants.h"
@@ -13,26 +17,91 @@
 #include "runtime/SystemLog.h"
 
 namespace Tulk {
+namespace {
 
-void WritePidFile() {
-  const std::string path = HostPath(kPidFilePath);
-  if (FILE* file = std::fopen(path.c_str(), "re"); file != nullptr) {
-    long pid = 0;
-    int fields = std::fscanf(file, "%ld", &pid);
-    (void)std::fclose(file);  // read only: nothing to lose
-    if (fields == 1 && pid > 0 && kill(static_cast<pid_t>(pid), 0) == 0) {
-      Log(LOG_ERR, "Attempt to run multiple TULK instances, not updating %s", kPidFilePath);
-      return;
-    }
+constexpr std::size_t kMaxPidText = 64;
+
+// The id the current file names, 0 when there is none or it is not a
+// regular file.
+long ReadPid(const std::string& path) {
+  const int fd = open(path.c_str(), O_RDONLY | O_NOFOLLOW | O_NONBLOCK | O_CLOEXEC);
+  if (fd < 0) {
+    return 0;
   }
-  int fd = open(path.c_str(), O_WRONLY | O_CREAT | O_TRUNC | O_CLOEXEC, 0644);
+  struct stat status {};
+  char text[kMaxPidText + 1] = {};
+  ssize_t got = -1;
+  if (fstat(fd, &status) == 0 && S_ISREG(status.st_mode)) {
+    got = read(fd, text, kMaxPidText);
+  }
+  close(fd);
+  if (got <= 0) {
+    return 0;
+  }
+  text[got] = '\0';
+  return ParsePid(text);
+}
+
+bool WriteAll(int fd, const std::string& text) {
+  std::size_t done = 0;
+  while (done < text.size()) {
+    const ssize_t written = write(fd, text.data() + done, text.size() - done);
+    if (written < 0 && errno == EINTR) {
+      continue;
+    }
+    if (written <= 0) {
+      return false;
+    }
+    done += static_cast<std::size_t>(written);
+  }
+  return true;
+}
+
+void ReplaceWithOwnPid(const std::string& path) {
+  std::string temporary = path + ".XXXXXX";
+  const int fd = mkostemp(temporary.data(), O_CLOEXEC);
   if (fd < 0) {
     return;
   }
-  std::string text = std::to_string(getpid());
-  ssize_t written = write(fd, text.data(), text.size());
-  (void)written;
-  close(fd);
+  const bool written = fchmod(fd, 0644) == 0 && WriteAll(fd, std::to_string(getpid()));
+  const bool closed = close(fd) == 0;
+  if (!written || !closed || rename(temporary.c_str(), path.c_str()) != 0) {
+    unlink(temporary.c_str());
+  }
+}
+
+}  // namespace
+
+long ParsePid(const char* text) {
+  const char* digits = text;
+  while (std::isspace(static_cast<unsigned char>(*digits))) {
+    ++digits;
+  }
+  if (!std::isdigit(static_cast<unsigned char>(*digits))) {
+    return 0;
+  }
+  errno = 0;
+  char* end = nullptr;
+  const long value = std::strtol(digits, &end, 10);
+  if (errno == ERANGE || value <= 0 || value > std::numeric_limits<pid_t>::max()) {
+    return 0;
+  }
+  while (std::isspace(static_cast<unsigned char>(*end))) {
+    ++end;
+  }
+  return *end == '\0' ? value : 0;
+}
+
+void WritePidFile() {
+  const std::string path = HostPath(kPidFilePath);
+  const long pid = ReadPid(path);
+  const bool live =
+      pid > 0 && pid != getpid() && (kill(static_cast<pid_t>(pid), 0) == 0 || errno == EPERM);
+  if (live) {
+    Log(LOG_ERR, "Attempt to run multiple TULK instances, not updating %s", kPidFilePath);
+    return;
+  }
+  ReplaceWithOwnPid(path);
 }
 
 }  // namespace Tulk

@@ -73,7 +73,6 @@ int RunDialog(Frame* owner, Args&&... args) {
 
 GeneralWindow::GeneralWindow(Frame* owner) : MenuWindow(owner) {
   SetMenuTitle(Text(TextId::kSystemCustomization));
-  SetKeepSelection(true);
   ReadHostState();
   BuildEntries();
   supportPages_ = ReadSupportPages();
@@ -239,7 +238,9 @@ void GeneralWindow::ReloadHostInfo() {
   ReadHostState();
   BuildEntries();
   SelectId(selected);
+  SetKeepSelection(true);
   Show();
+  SetKeepSelection(false);
 }
 
 }  // namespace Tulk

@@ -59,9 +59,11 @@
 ///   and hands it the restart question an IPv6 change needs: the shutdown
 ///   dialog in its required-restart mode (ShutdownDialog.h).
 /// - After a screen opened with Enter returns, the window is shown again
-///   with the same entry selected (when that entry is still enabled, else
-///   the first entry). Enter on entries 11 and 12 does nothing and redraws
-///   nothing.
+///   from the first entry, as when it was opened. Enter on entries 11 and
+///   12 does nothing and redraws nothing.
+/// - SIGUSR1 rebuilds the entries but keeps the selected one (when it can
+///   still be chosen, else the first): a reload the operator did not ask
+///   for should not move the selection under their hands.
 /// - Entry 8 opens RestartNetworkDialog (after the missing-interface
 ///   message when there is no management NIC), entry 9 TestDialog, entry 10
 ///   NetworkRestoreWindow; after the restore window the host state is read

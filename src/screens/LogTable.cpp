@@ -21,7 +21,7 @@ LogTable::LogTable()
 std::string LogTable::Describe() {
   for (Row& row : rows_) {
     struct stat status {};
-    row.available = stat(HostPath(row.path).c_str(), &status) == 0;
+    row.available = stat(HostPath(row.path).c_str(), &status) == 0 && S_ISREG(status.st_mode);
   }
   return FormatLogList(rows_);
 }

@@ -15,7 +15,9 @@
 /// | 7   | Brimlo Tavi Observation log (qobd)     | /var/log/qobd.log       |
 ///
 /// ("Availibility" is the product's own spelling.) The list on screen
-/// numbers only the files that exist, consecutively from 1.
+/// numbers only the files that exist, consecutively from 1. A log counts
+/// as existing only when it is a regular file (a symbolic link to one
+/// counts): the pager cannot show a FIFO or a device, and would hang on it.
 
 #include <array>
 #include <cstddef>
@@ -37,7 +39,7 @@ class LogTable {
   LogTable();
 
   /// Asks the file system for each file's status (paths under the host
-  /// root) and returns the list text: one line
+  /// root; regular files only) and returns the list text: one line
   /// "{color:white}<N> {color:light-grey}name{/color}" per existing file,
   /// N counting the existing files from 1.
   std::string Describe();

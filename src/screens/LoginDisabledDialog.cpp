@@ -1,6 +1,5 @@
 #include "screens/LoginDisabledDialog.h"
 
-#include "include/Keys.h"
 #include "render/TextId.h"
 #include "screens/ConsoleLogin.h"
 
@@ -23,12 +22,8 @@ void LoginDisabledDialog::ShowTexts() {
 }
 
 int LoginDisabledDialog::Run() {
-  for (;;) {
-    const int key = WaitKey();
-    if (key == kKeyEnter || key == kKeyEsc) {
-      return 0;
-    }
-  }
+  WaitForEnter();
+  return 0;
 }
 
 }  // namespace Tulk

@@ -5,9 +5,9 @@
 ///
 /// A dialog 60 x 9 with a header of 6 rows: "Direct console access has
 /// been disabled by the administrator for <host>.<domain>." and the
-/// Enter/OK footer. It never logs anybody in: Enter closes it, and so does
-/// Esc (the operator expects Esc to go back as everywhere else); every
-/// other key is ignored. The result is always 0.
+/// Enter/OK footer, the only key it offers. It never logs anybody in:
+/// Enter closes it; every other key, Esc too, is ignored. The result is
+/// always 0.
 
 #include "toolkit/Dialog.h"
 
@@ -18,7 +18,7 @@ class LoginDisabledDialog : public Dialog {
   /// Lays the dialog out above `owner` with its texts.
   explicit LoginDisabledDialog(Frame* owner);
 
-  /// Waits for Enter (or Esc); returns 0.
+  /// Waits for Enter; returns 0.
   int Run() override;
 
  private:

@@ -20,7 +20,7 @@ int PowerConfirmDialog::Run() {
   SetTitle(Text(titleId_));
   SetText(Text(messageId_));
   PowerOffVirtualMachines(graceful_);
-  if (RunShellCommand(command_) == -1) {
+  if (RunShellCommand(command_, kPowerCommandTimeoutSeconds) == -1) {
     return 0;
   }
   for (;;) {

@@ -7,10 +7,12 @@
 /// 1. title and progress text;
 /// 2. "osk-cmd -U <user> hostsvc/autostartmanager/autostop", then
 ///    "/bin/powerOffVms", with "--terminate" unless the running machines
-///    are to stop gracefully (both logged by the runner; a failure does not
-///    stop the shutdown);
-/// 3. the host's command through "/bin/sh -c";
-/// 4. when that could not be run at all (-1) the dialog returns 0 and the
+///    are to stop gracefully (both logged by the runner, each within
+///    kPowerOffVmsTimeoutSeconds; a failure does not stop the shutdown);
+/// 3. the host's command through "/bin/sh -c", within
+///    kPowerCommandTimeoutSeconds;
+/// 4. when that could not be run at all or was killed by its limit (-1)
+///    the dialog returns 0 and the
 ///    operator is back in the shutdown dialog. Otherwise it waits for keys
 ///    and ignores them while the host goes down; the wait blocks in the key
 ///    loop, so the console uses no CPU meanwhile (an idle timeout still

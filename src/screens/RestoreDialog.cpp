@@ -20,7 +20,8 @@ constexpr char kResetScript[] = "/sbin/firmwareConfig.py";
 
 [[noreturn]] void WaitForHostToGoDown() {
   for (;;) {
-    if (PollInput(nullptr) == kPollTerminate) {
+    const int result = PollInput(nullptr);
+    if (result == kPollTerminate || result == kPollHangUp) {
       std::exit(0);
     }
   }
@@ -51,7 +52,7 @@ int RestoreDialog::Run() {
     SetText(Text(TextId::kResetWait));
   }
   const std::string reset = ShellQuote(HostPath(kResetScript)) + " --reset-only > /dev/null 2>&1";
-  if (RunShellCommand(reset) != 0) {
+  if (RunShellCommand(reset, kResetTimeoutSeconds) != 0) {
     return 0;
   }
 
@@ -62,7 +63,7 @@ int RestoreDialog::Run() {
     SetText(Text(TextId::kResetDone));
   }
   WaitForEnter();
-  if (RunShellCommand("reboot -f") == -1) {
+  if (RunShellCommand("reboot -f", kPowerCommandTimeoutSeconds) == -1) {
     return 0;
   }
   WaitForHostToGoDown();

@@ -57,7 +57,7 @@ std::string CertificateThumbprint(unsigned bits) {
   const int rc = RunCommand(
       kOpenssl,
       {"openssl", "x509", "-in", HostPath(kHostCertificatePath), "-noout", "-fingerprint", option},
-      output, &outputLength, error, &errorLength, nullptr, 0, 0);
+      output, &outputLength, error, &errorLength, nullptr, 0, kQueryTimeoutSeconds);
   std::string thumbprint;
   if (rc == 0) {
     thumbprint = ParseThumbprint(std::string(output, static_cast<std::size_t>(outputLength)));
@@ -74,7 +74,7 @@ std::string HostKeyFingerprint(const std::string& keyPath) {
   std::int32_t outputLength = kCaptureBufferSize;
   std::int32_t errorLength = kCaptureBufferSize;
   const int rc = RunCommand(kSshKeygen, {"ssh-keygen", "-l", "-f", HostPath(keyPath)}, output,
-                            &outputLength, error, &errorLength, nullptr, 0, 0);
+                            &outputLength, error, &errorLength, nullptr, 0, kQueryTimeoutSeconds);
   if (rc != 0) {
     Log(LOG_ERR, "SSH Key Fingerprint generation failed: %s",
         WithoutTrailingSpace(std::string(error, static_cast<std::size_t>(errorLength))).c_str());

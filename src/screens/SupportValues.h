@@ -15,7 +15,8 @@
 /// in its place) and leaves one line in the system log. Every program and
 /// file path is resolved under the host root (runtime/HostPath.h); the
 /// programs run through the command runner (host/CommandRunner.h) with up
-/// to 255 bytes of output and of error captured.
+/// to 255 bytes of output and of error captured, each within
+/// kQueryTimeoutSeconds (a program killed by it counts as failed).
 
 #include <string>
 

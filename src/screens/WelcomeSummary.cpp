@@ -4,6 +4,7 @@
 #include <cctype>
 #include <cstdio>
 
+#include "host/NetworkInventory.h"
 #include "render/StringFactory.h"
 #include "render/TextId.h"
 
@@ -146,7 +147,8 @@ std::string WelcomeSummary::Warning(const WelcomeFacts& facts, StringFactory& st
 }
 
 std::string WelcomeSummary::ProcessorAndMemory(const WelcomeFacts& facts) {
-  return ProcessorLine(facts.cpuPackages, facts.cpuModel) + "\n" + MemoryLine(facts.memoryBytes);
+  return ProcessorLine(facts.cpuPackages, facts.cpuModel) + "\n" +
+         (facts.memoryBytes == 0 ? std::string(kNotAvailable) : MemoryLine(facts.memoryBytes));
 }
 
 std::string WelcomeSummary::Footer(StringFactory& strings) {

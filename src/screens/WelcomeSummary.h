@@ -64,7 +64,8 @@ class WelcomeSummary {
   /// DHCP-failure warning (142) while DHCP has no address, else empty.
   static std::string Warning(const WelcomeFacts& facts, StringFactory& strings);
 
-  /// The processor line, a newline and the memory line.
+  /// The processor line, a newline and the memory line ("N/A" when the
+  /// memory size is unknown, 0).
   static std::string ProcessorAndMemory(const WelcomeFacts& facts);
 
   /// The footer: "<F2> Customize System/View Logs" left, "<F12> Shut

@@ -103,8 +103,7 @@ void WelcomeWindow::FillSummary() {
   const WelcomeFacts facts = ReadWelcomeFacts();
   warningArea_->SetText(WelcomeSummary::Warning(facts, strings));
   if (!facts.hasPhysicalNics && !g_noAdapterAlertSent) {
-    RaiseSystemAlert(WelcomeSummary::kNoAdapterAlert);
-    g_noAdapterAlertSent = true;
+    g_noAdapterAlertSent = RaiseSystemAlert(WelcomeSummary::kNoAdapterAlert);
   }
   addressBlock_->SetText(WelcomeSummary::AddressBlock(facts, strings));
   versionLine_->SetText(Text(TextId::kVersionLine));

@@ -11,6 +11,8 @@
 #include <chrono>
 #include <cstdio>
 #include <filesystem>
+#include <fstream>
+#include <iterator>
 #include <string>
 #include <thread>
 #include <vector>
@@ -208,6 +210,41 @@ TEST_F(CommandRunnerTest, ShellAndLoggedCommands) {
              "stderr=err)"));
   EXPECT_TRUE(Logged("<14>Command \"sh -c true\" succeeded"));
   EXPECT_TRUE(Logged("<11>Command \"absent x\" failed (rc=-1): (stdout=, stderr=)"));
+}
+
+// Whether process `pid` still runs (a zombie waiting for its parent does
+// not).
+bool StillRuns(const std::string& pid) {
+  std::ifstream stat("/proc/" + pid + "/stat");
+  std::string text((std::istreambuf_iterator<char>(stat)), std::istreambuf_iterator<char>());
+  const std::size_t name = text.rfind(')');
+  return name != std::string::npos && text.size() > name + 2 && text[name + 2] != 'Z';
+}
+
+// A shell line killed by its limit takes the programs it started with it:
+// a hung tool at the head of a pipeline must not outlive the console's wait.
+TEST_F(CommandRunnerTest, LimitEndsEveryProgramTheCommandStarted) {
+  const std::filesystem::path record = HostTest::Root() / "tmp/started.pid";
+  std::filesystem::remove(record);
+  const std::string line = "sleep 300 & echo $! > " + record.string() + "; sleep 300 | cat";
+  EXPECT_EQ(Shell(line, "", 1).rc, -1);
+  std::string started;
+  std::ifstream(record) >> started;
+  ASSERT_FALSE(started.empty());
+  for (int check = 0; check < 250 && StillRuns(started); ++check) {
+    std::this_thread::sleep_for(20ms);
+  }
+  EXPECT_FALSE(StillRuns(started)) << "the background program " << started << " still runs";
+}
+
+// The shell and logged runners pass their limit on, and a killed command
+// takes the logged runner's failure line.
+TEST_F(CommandRunnerTest, ShellAndLoggedCommandsHaveALimit) {
+  HostTest::WriteScript("/sbin/hangs", "exec sleep 300");
+  EXPECT_EQ(Tulk::RunShellCommand("hangs", 1), -1);
+  EXPECT_EQ(Tulk::RunLoggedCommand("/sbin/hangs", {"hangs"}, nullptr, 1), -1);
+  EXPECT_TRUE(Logged("<12>Killing process because 1 seconds timeout expired"));
+  EXPECT_TRUE(Logged("<11>Command \"hangs\" failed (rc=-1): (stdout=, stderr=)"));
 }
 
 }  // namespace

@@ -250,9 +250,28 @@ TEST(HostTools, InstallLaysOutARootRepeatedly) {
   for (const char* folder : {"var/run", "var/log", "etc/brimlo/ssl", "var/lib/tulk-sim"}) {
     EXPECT_TRUE(std::filesystem::is_directory(root / folder)) << folder;
   }
-  EXPECT_EQ(SimTest::RunProgram({TULK_TEST_HOSTTOOL, "--install", "/"}).status, 1);
+  const std::filesystem::path linkToRoot = root.parent_path() / "link-to-root";
+  std::filesystem::create_directory_symlink("/", linkToRoot);
+  for (const std::string& real : {std::string("/"), std::string("/tmp/.."), linkToRoot.string()}) {
+    EXPECT_EQ(SimTest::RunProgram({TULK_TEST_HOSTTOOL, "--install", real}).status, 1) << real;
+  }
   Finished demo = SimTest::RunProgram({TULK_TEST_HOSTTOOL, "--demo-state"});
   EXPECT_EQ(json::parse(demo.out)["network"]["dns"]["hostname"], "tavi-01");
+}
+
+// A tool whose root leads to the machine's own root refuses before it acts
+// or records anything.
+TEST(HostTools, ToolRefusesARootThatIsTheRealOne) {
+  ScratchHost host;
+  const std::string scratch = host.Root().string();
+  for (const char* root : {"/tmp/..", "/proc/self/root"}) {
+    setenv("TULK_ROOT", root, 1);
+    Finished run = host.Run("bin/osk-cmd", {"-U", "root", "internalsvc/refresh"});
+    EXPECT_EQ(run.status, 1) << root;
+    EXPECT_NE(run.err.find("refusing to act on the real root"), std::string::npos) << run.err;
+  }
+  setenv("TULK_ROOT", scratch.c_str(), 1);
+  EXPECT_EQ(host.Run("bin/osk-cmd", {"-U", "root", "internalsvc/refresh"}).status, 0);
 }
 
 TEST(HostTools, WithoutAStateFileAToolRefuses) {

@@ -7,6 +7,7 @@
 #include <unistd.h>
 
 #include <atomic>
+#include <filesystem>
 #include <fstream>
 #include <functional>
 #include <sstream>
@@ -171,14 +172,86 @@ TEST(StateStore, MalformedFileStopsStartupWithOneLineAndExitOne) {
   EXPECT_NE(run.err.find("malformed host state: not valid JSON"), std::string::npos) << run.err;
 }
 
+// Any path that leads to the machine's own root is refused, not only "/"
+// as written; so is a root that does not exist.
 TEST(StateStore, RefusesToRunAgainstTheRealRoot) {
   ScratchHost host;
-  setenv("TULK_ROOT", "/", 1);
-  SimTest::Finished run = PreferenceInitInChild();
-  EXPECT_EQ(run.status, 1);
-  EXPECT_NE(run.err.find("TULK_ROOT"), std::string::npos) << run.err;
+  const std::filesystem::path linkToRoot = host.Root().parent_path() / "link-to-root";
+  std::filesystem::create_directory_symlink("/", linkToRoot);
+  std::string climb = host.Root().string();
+  for (const char c : host.Root().string()) {
+    if (c == '/') {
+      climb += "/..";
+    }
+  }
+  for (const std::string& root :
+       {std::string("/"), std::string("//"), std::string("/./"), std::string("/tmp/.."),
+        std::string("/proc/self/root"), linkToRoot.string(), climb,
+        (host.Root() / "missing").string(), std::string()}) {
+    setenv("TULK_ROOT", root.c_str(), 1);
+    SimTest::Finished run = PreferenceInitInChild();
+    EXPECT_EQ(run.status, 1) << "TULK_ROOT=" << root;
+    EXPECT_NE(run.err.find("TULK_ROOT"), std::string::npos) << run.err;
+  }
   setenv("TULK_ROOT", host.Root().c_str(), 1);
   EXPECT_EQ(PreferenceInitInChild().status, 0);
+}
+
+// A file nested too deep for the writers to walk is malformed, at start and
+// when it replaces a good state.
+TEST(StateStore, DeeplyNestedStateIsRefused) {
+  std::string deep = "{\"extra\": ";
+  for (int level = 0; level < 50000; ++level) {
+    deep += "[";
+  }
+  deep += std::string(50000, ']') + "}";
+  {
+    ScratchHost host(deep);
+    SimTest::Finished run = PreferenceInitInChild();
+    EXPECT_EQ(run.status, 1);
+    EXPECT_NE(run.err.find("malformed host state: nesting deeper than 64 levels"),
+              std::string::npos)
+        << run.err;
+  }
+  ScratchHost host;
+  HykCtl::Adv::UserAdvancedOptionImpl options;
+  EXPECT_EQ(options.GetUserOption("/UserVars/TulkTimeOut"), 600);
+  std::ofstream(host.StateFile()) << deep;
+  EXPECT_EQ(options.GetUserOption("/UserVars/TulkTimeOut"), 600);
+  EXPECT_THROW(options.SetUserOption("/UserVars/TulkTimeOut", 5), HostMgrException);
+
+  // Nesting the writers can walk is kept.
+  json state = json::object();
+  json* level = &state["extra"];
+  for (int depth = 0; depth < 60; ++depth) {
+    level = &(*level)["next"];
+  }
+  *level = 1;
+  host.WriteState(state);
+  options.SetUserOption("/UserVars/TulkTimeOut", 5);
+  EXPECT_EQ(host.ReadState()["advancedOptions"]["/UserVars/TulkTimeOut"], 5);
+}
+
+// A writer killed between writing its temporary file and renaming it leaves
+// the file behind; the next write clears such files away, and only them.
+TEST(StateStore, NextWriteRemovesTemporariesLeftByKilledWriters) {
+  ScratchHost host;
+  const std::filesystem::path folder = host.StateFile().parent_path();
+  const std::string name = host.StateFile().filename().string();
+  for (const std::string& left : {name + ".tmp.Ab3dE9", name + ".tmp.zz0001"}) {
+    std::ofstream(folder / left) << "{\"half\": ";
+  }
+  std::ofstream(folder / "notes.tmp.keep") << "not ours";
+  HykCtl::Adv::UserAdvancedOptionImpl().SetUserOption("/UserVars/TulkTimeOut", 90);
+  std::vector<std::string> names;
+  for (const auto& entry : std::filesystem::directory_iterator(folder)) {
+    names.push_back(entry.path().filename().string());
+  }
+  for (const std::string& entry : names) {
+    EXPECT_EQ(entry.find(name + ".tmp."), std::string::npos) << entry;
+  }
+  EXPECT_TRUE(std::filesystem::exists(folder / "notes.tmp.keep"));
+  EXPECT_EQ(host.ReadState()["advancedOptions"]["/UserVars/TulkTimeOut"], 90);
 }
 
 TEST(StateStore, FaultsReachEveryKindOfOperation) {

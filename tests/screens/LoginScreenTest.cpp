@@ -238,4 +238,40 @@ TEST(LoginScreenTest, KeyboardLabelOnALocalConsole) {
   EXPECT_TRUE(console.Contains("Configured Keyboard (US Default)"));
 }
 
+// The cursor marks the selected item, the keyboard label included: at the
+// start of its text, on opening, after moving back to it and after the
+// keyboard dialog it opens.
+TEST(LoginScreenTest, CursorStandsOnTheKeyboardLabelWhileItIsSelected) {
+  TulkTest::Options options = ConsoleOptions();
+  options.term = "xterm";
+  TestConsole console(options);
+  ASSERT_TRUE(Settled(console, "Customize System/View Logs"));
+  console.Key("F2");
+  ASSERT_TRUE(Settled(console, "Configured Keyboard (US Default)"));
+  const int label = RowOf(console, "Configured Keyboard");
+  int column = -1;
+  for (int col = 0; col < 70 && column < 0; ++col) {
+    if (SessionTest::Cells(console, label, col, 10) == "Configured") {
+      column = col;
+    }
+  }
+  ASSERT_GE(column, 0);
+  const auto onLabel = [&] {
+    const TulkTest::CursorState cursor = console.Cursor();
+    return cursor.visible && cursor.row == label && cursor.col == column;
+  };
+  EXPECT_TRUE(WaitUntil(console, onLabel, "the cursor on the label")) << console.Dump();
+  console.Key("Tab");
+  ASSERT_TRUE(WaitUntil(
+      console, [&] { return console.Cursor().row == label + 1; }, "the login name"));
+  console.Key("Up");
+  EXPECT_TRUE(WaitUntil(console, onLabel, "the cursor back on the label")) << console.Dump();
+  console.Key("Enter");
+  ASSERT_TRUE(Settled(console, "Configure Keyboard"));
+  console.Key("Esc");
+  ASSERT_TRUE(Gone(console, "Configure Keyboard"));
+  EXPECT_TRUE(WaitUntil(console, onLabel, "the cursor on the label after the dialog"))
+      << console.Dump();
+}
+
 }  // namespace

@@ -63,6 +63,8 @@ TEST(MenuDialogScreenTest, LockdownToggleRoundTrip) {
   TestConsole console(DriverOptions());
   ASSERT_TRUE(SelectEntry(console, "Configure Lockdown Mode"));
   EXPECT_TRUE(console.WaitForText("Disabled"));
+  // After the dialog the menu shows from the first entry again; the
+  // lockdown entry then tells the new state.
   struct Step {
     bool toggle;
     const char* key;
@@ -76,6 +78,7 @@ TEST(MenuDialogScreenTest, LockdownToggleRoundTrip) {
       {true, "Enter", "[X] Enable lockdown mode", false, "Disabled"},
   };
   for (const Step& step : steps) {
+    ASSERT_TRUE(SelectEntry(console, "Configure Lockdown Mode"));
     console.Key("Enter");
     ASSERT_TRUE(MenuTest::Settled(console, step.before));
     EXPECT_TRUE(console.WaitForText("When enabled, lockdown mode prevents users"));
@@ -83,6 +86,10 @@ TEST(MenuDialogScreenTest, LockdownToggleRoundTrip) {
     console.Key(step.key);
     ASSERT_TRUE(MenuTest::Gone(console, "Enable lockdown mode"));
     EXPECT_EQ(HostState(console)["lockdown"]["enabled"], step.expected);
+    EXPECT_TRUE(MenuTest::WaitUntil(
+        console, [&] { return MenuTest::RightTitle(console) == "Configure Password"; },
+        "the first entry"));
+    ASSERT_TRUE(SelectEntry(console, "Configure Lockdown Mode"));
     EXPECT_TRUE(console.WaitForText(step.shown));
   }
   EXPECT_TRUE(
@@ -102,6 +109,7 @@ TEST(MenuDialogScreenTest, KeyboardLayoutChangeReachesTheHost) {
   ASSERT_TRUE(MenuTest::Gone(console, "(o) US Default"));
   EXPECT_EQ(HostState(console)["system"]["keyboardLayout"], "US Default");
 
+  ASSERT_TRUE(SelectEntry(console, "Configure Keyboard"));
   console.Key("Enter");
   ASSERT_TRUE(MenuTest::Settled(console, "(o) US Default"));
   console.Key("Down");
@@ -109,6 +117,7 @@ TEST(MenuDialogScreenTest, KeyboardLayoutChangeReachesTheHost) {
   ASSERT_TRUE(MenuTest::Gone(console, "If you are having difficulty"));
   EXPECT_TRUE(console.WaitForLog("<14>Keyboard layout changed to US Dvorak"));
   EXPECT_EQ(HostState(console)["system"]["keyboardLayout"], "US Dvorak");
+  ASSERT_TRUE(SelectEntry(console, "Configure Keyboard"));
   console.Key("Enter");
   EXPECT_TRUE(console.WaitForText("(o) US Dvorak"));
 }

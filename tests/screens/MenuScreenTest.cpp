@@ -266,4 +266,27 @@ TEST(MenuScreenTest, OneDownFitsASlowSerialLine) {
   }
 }
 
+// After Enter on an entry and the screen it opened, the menu starts again
+// from the first entry, as when it was opened.
+TEST(MenuScreenTest, MenuShowsFromTheFirstEntryAfterAScreen) {
+  TulkTest::Options options = DriverOptions();
+  options.term = "xterm";
+  TestConsole console(options);
+  const struct {
+    const char* entry;
+    const char* dialogText;
+  } entries[] = {{"Configure Keyboard", "choose a layout that matches"},
+                 {"Configure Lockdown Mode", "[ ] Enable lockdown mode"}};
+  for (const auto& entry : entries) {
+    ASSERT_TRUE(SelectEntry(console, entry.entry));
+    console.Key("Enter");
+    ASSERT_TRUE(console.WaitForText(entry.dialogText));
+    console.Key("Esc");
+    EXPECT_TRUE(MenuTest::WaitUntil(
+        console, [&] { return MenuTest::RightTitle(console) == "Configure Password"; },
+        "the first entry"))
+        << entry.entry;
+  }
+}
+
 }  // namespace

@@ -1,6 +1,6 @@
 // The welcome screen on the real binary: the summary drawn from the
-// simulated host, its layouts and warnings, and the way out on a host
-// failure.
+// simulated host, its layouts and warnings, and what it shows when the
+// host cannot be asked.
 
 #include <signal.h>
 
@@ -177,34 +177,82 @@ TEST(WelcomeScreenTest, CustomMessageAndBackOnReload) {
   EXPECT_TRUE(console.Contains("<F2> Customize System/View Logs"));
 }
 
-TEST(WelcomeScreenTest, HostFailureEndsTheRunWithStatusZero) {
+// Every query behind the summary fails at once: the console still comes
+// up, shows what it can with its fillers, and logs each failure.
+TEST(WelcomeScreenTest, FailingHostQueriesLeaveFillersOnTheScreen) {
   json host = DemoHostState();
-  host["faults"]["HykCtl::Hardware::CpuInfoImpl::GetModelName"] = "processor query failed";
+  host["system"]["bootOption"] = 1;  // audit mode, if it could be read
+  const struct {
+    const char* fault;
+    const char* line;
+  } failures[] = {
+      {"NetworkInfoImpl::GetPnics", "<11>Getting physical nics failed: F1"},
+      {"NetworkInfoImpl::IsHykIpv6Enabled", "<11>Getting IPv6 state failed: F2"},
+      {"HykNicImpl::GetIpConfig", "<11>Getting management IP configuration failed: F3"},
+      {"DnsConfigImpl::GetHostname", "<11>Getting host name failed: F4"},
+      {"HardwareInfoImpl::GetVendorName", "<11>Getting vendor name failed: F5"},
+      {"HardwareInfoImpl::GetProductName", "<11>Getting product name failed: F6"},
+      {"CpuInfoImpl::GetNumCpuPackages", "<11>Getting processor packages failed: F7"},
+      {"CpuInfoImpl::GetModelName", "<11>Getting processor model failed: F8"},
+      {"MemoryInfoImpl::GetTotalPages", "<11>Getting memory size failed: F9"},
+      {"SystemInfoImpl::GetWelcomeMessage", "<11>Getting welcome message failed: F10"},
+      {"HSI_Get", "<11>Getting boot option failed: F11"},
+  };
+  int number = 0;
+  for (const auto& failure : failures) {
+    host["faults"][failure.fault] = "F" + std::to_string(++number);
+  }
   TestConsole console(ConsoleOptions(host));
-  ASSERT_TRUE(console.WaitForLog("TULK aborted by exception: processor query failed"));
-  EXPECT_EQ(console.WaitExit(), 0);
-  EXPECT_EQ(SessionTest::CountLog(console, "<11>TULK aborted by exception: processor query failed"),
-            1);
+  ASSERT_TRUE(Settled(console, "To manage this host, go to:"));
+  for (const auto& failure : failures) {
+    EXPECT_TRUE(console.WaitForLog(failure.line));
+  }
+  EXPECT_EQ(SessionTest::Cells(console, kHardwareRow, 8, 4), "N/A ");
+  EXPECT_EQ(SessionTest::Cells(console, kProcessorRow, 8, 4), "N/A ");
+  EXPECT_EQ(SessionTest::Cells(console, kMemoryRow, 8, 4), "N/A ");
+  EXPECT_TRUE(console.Contains("https://0.0.0.0/ (STATIC)")) << console.Dump();
+  EXPECT_FALSE(console.Contains("audit mode")) << console.Dump();
+  EXPECT_TRUE(console.Contains("<F2> Customize System/View Logs"));
+  for (const std::string& line : console.LogLines()) {
+    EXPECT_EQ(line.find("aborted"), std::string::npos) << line;
+  }
+  console.Key("F2");
+  EXPECT_TRUE(Settled(console, "Authentication Required"));
 }
 
-TEST(WelcomeScreenTest, LoginDisabledDialogLeadsBackToTheSummary) {
+// The version line keeps the last text it could build.
+TEST(WelcomeScreenTest, VersionLineOutlivesAFailingVersionQuery) {
+  json host = DemoHostState();
+  TestConsole console(ConsoleOptions(host));
+  ASSERT_TRUE(Settled(console, "To manage this host, go to:"));
+  host["faults"]["HSI_Get"] = "version unreadable";
+  host["network"]["dns"]["hostname"] = "tavi-77";
+  TulkTest::ReplaceHostState(console, host);
+  console.Signal(SIGUSR1);
+  ASSERT_TRUE(Settled(console, "https://tavi-77/"));
+  EXPECT_EQ(SessionTest::Cells(console, kVersionRow, 8, 27), "Brimlo Tavi 8.1.0 (HyKernel");
+}
+
+TEST(WelcomeScreenTest, LoginDisabledDialogClosesOnEnterOnly) {
   TulkTest::Options options = ConsoleOptions();
   options.prepareRoot = nullptr;  // no console-login marker
   TestConsole console(options);
   ASSERT_TRUE(Settled(console, "To manage this host"));
-  for (const char* close : {"Esc", "Enter"}) {
-    console.Key("F12");
+  for (const char* open : {"F12", "F2"}) {
+    console.Key(open);
     ASSERT_TRUE(Settled(console, "Authentication Denied"));
     EXPECT_TRUE(console.Contains("Direct console access has been disabled by the"));
     EXPECT_TRUE(console.Contains("administrator for tavi-01.lab.example.net."));
-    console.Type("x");
-    console.Key(close);
-    ASSERT_TRUE(Gone(console, "Authentication Denied")) << close;
+    // Esc is ignored as every key but Enter is.
+    for (const char* ignored : {"Esc", "F4"}) {
+      console.Key(ignored);
+      ASSERT_TRUE(console.WaitReady());
+      EXPECT_TRUE(console.Contains("Authentication Denied")) << open << " " << ignored;
+    }
+    console.Key("Enter");
+    ASSERT_TRUE(Gone(console, "Authentication Denied")) << open;
+    EXPECT_TRUE(console.WaitForText("https://10.20.30.41/ (STATIC)"));
   }
-  console.Key("F2");
-  ASSERT_TRUE(Settled(console, "Authentication Denied"));
-  console.Key("Esc");
-  ASSERT_TRUE(Gone(console, "Authentication Denied"));
   EXPECT_TRUE(SessionTest::RecordsWhere(console, "audit.jsonl", "event", "tulk.login").empty());
   EXPECT_TRUE(console.Running());
 }

@@ -9,15 +9,12 @@
 extern "C" {
 
 // The simulated host's start: it refuses to run against the real machine's
-// root, and loads the host state before the screen starts, so that a bad
-// state file is reported on standard error with exit status 1.
+// root (whatever path leads there: "/tmp/..", "/proc/self/root", a link to
+// "/") or a root that does not exist, and loads the host state before the
+// screen starts, so that a bad state file is reported on standard error with
+// exit status 1.
 void Preference_Init() {
-  const char* value = std::getenv("TULK_ROOT");
-  std::string root = value != nullptr ? value : "";
-  while (!root.empty() && root.back() == '/') {
-    root.pop_back();
-  }
-  if (root.empty() || root == "/." || root.find_first_not_of("/.") == std::string::npos) {
+  if (Sim::ResolvedScratchRoot().empty()) {
     std::fprintf(stderr,
                  "tulk: the simulated host needs TULK_ROOT set to a scratch root "
                  "(scripts/make-demo-root.sh builds one)\n");

@@ -7,6 +7,7 @@
 #include <cerrno>
 #include <cstdlib>
 #include <cstring>
+#include <filesystem>
 #include <fstream>
 #include <sstream>
 
@@ -160,9 +161,25 @@ void SimHost::ReadFile() {
   }
   std::stringstream text;
   text << in.rdbuf();
-  nlohmann::json parsed = nlohmann::json::parse(text.str(), nullptr, false);
+  // Containers nested too deep are dropped while parsing (never built),
+  // and the file is then refused as a whole.
+  bool tooDeep = false;
+  nlohmann::json parsed = nlohmann::json::parse(
+      text.str(),
+      [&tooDeep](int depth, nlohmann::json::parse_event_t, nlohmann::json&) {
+        if (depth > kMaxStateDepth) {
+          tooDeep = true;
+          return false;
+        }
+        return true;
+      },
+      false);
   if (parsed.is_discarded()) {
     throw StateError(path_ + ": malformed host state: not valid JSON");
+  }
+  if (tooDeep) {
+    throw StateError(path_ + ": malformed host state: nesting deeper than " +
+                     std::to_string(kMaxStateDepth) + " levels");
   }
   try {
     ValidateState(parsed);
@@ -198,15 +215,18 @@ void SimHost::Modify(const std::function<void(nlohmann::json&)>& change) {
   std::lock_guard guard(mutex_);
   EnsureLoaded();
   StateLock lock(path_);
-  if (FileChanged()) {
-    try {
-      ReadFile();
-    } catch (const StateError& error) {
-      throw HostMgr::Lib::HostMgrException(error.what());
-    }
+  // Under the lock the file is read again whatever its stamp says: a file
+  // system that reuses inode numbers at once and keeps coarse times can
+  // give another writer's file the very stamp of this one's last write,
+  // and the change would then be applied to a stale copy.
+  try {
+    ReadFile();
+  } catch (const StateError& error) {
+    throw HostMgr::Lib::HostMgrException(error.what());
   }
   nlohmann::json next = snapshot_->state;
   change(next);
+  RemoveLeftoverTemporaries(path_);
   try {
     WriteFileAtomically(path_, next.dump(2) + "\n");
   } catch (const StateError& error) {
@@ -282,6 +302,34 @@ void WriteFileAtomically(const std::string& path, const std::string& text) {
     unlink(temporary.c_str());
     throw StateError(path + ": cannot write host state: " + std::strerror(error));
   }
+}
+
+void RemoveLeftoverTemporaries(const std::string& path) {
+  const std::filesystem::path file(path);
+  const std::string prefix = file.filename().string() + ".tmp.";
+  std::error_code error;
+  std::filesystem::directory_iterator entries(file.parent_path(), error);
+  for (; !error && entries != std::filesystem::directory_iterator(); entries.increment(error)) {
+    const std::string name = entries->path().filename().string();
+    std::error_code ignored;
+    if (name.starts_with(prefix) && entries->is_regular_file(ignored)) {
+      std::filesystem::remove(entries->path(), ignored);
+    }
+  }
+}
+
+std::string ResolvedScratchRoot() {
+  const std::string root = Environment("TULK_ROOT");
+  if (root.empty()) {
+    return {};
+  }
+  char* resolved = realpath(root.c_str(), nullptr);
+  if (resolved == nullptr) {
+    return {};
+  }
+  std::string result = resolved;
+  std::free(resolved);
+  return result == "/" ? std::string() : result;
 }
 
 std::string RootPath(std::string_view path) {

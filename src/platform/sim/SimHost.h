@@ -18,9 +18,11 @@
 /// written back at once and atomically (temporary file, fsync, rename): the
 /// console and the tools may change the file concurrently without losing
 /// an update, a change is seen by the next run, and a crash never leaves a
-/// half-written file. Reads re-read the file only when it was replaced
-/// (device, inode, size and modification time are compared), so a query
-/// on an unchanged state costs one stat().
+/// half-written file. A change always reads the file again under the lock
+/// (a stamp can repeat: inode numbers are reused and times are coarse).
+/// Reads re-read the file only when it was replaced (device, inode, size
+/// and modification time are compared), so a query on an unchanged state
+/// costs one stat().
 ///
 /// Threads: the console's worker threads (the network test, the live core
 /// capture) run host programs and edit the hosts file while the main
@@ -114,9 +116,26 @@ class SimHost {
   struct stat stamp_ {};
 };
 
-/// Writes `text` to `path` atomically (temporary file in the same folder,
-/// fsync, rename). Throws StateError on failure.
+/// Writes `text` to `path` atomically (temporary file "<path>.tmp.XXXXXX"
+/// in the same folder, fsync, rename). Throws StateError on failure.
 void WriteFileAtomically(const std::string& path, const std::string& text);
+
+/// Removes the temporary files "<path>.tmp.*" that a writer killed in the
+/// middle of WriteFileAtomically() left beside `path`. Call it only while
+/// holding the lock every writer of `path` takes, so that no live writer's
+/// file is removed.
+void RemoveLeftoverTemporaries(const std::string& path);
+
+/// The deepest nesting of arrays and objects a host state may have. A state
+/// nested deeper is malformed ("nesting deeper than 64 levels"): the
+/// writers walk it recursively.
+inline constexpr int kMaxStateDepth = 64;
+
+/// TULK_ROOT with every symbolic link, "." and ".." resolved; empty when it
+/// is unset or empty, cannot be resolved (it does not exist), or resolves
+/// to the machine's own root "/" (such as "/tmp/..", "/proc/self/root" or
+/// a link to "/"). The simulated host acts only on a root this returns.
+std::string ResolvedScratchRoot();
 
 /// `path` (absolute) under the host root TULK_ROOT ("/" when unset).
 std::string RootPath(std::string_view path);

@@ -76,6 +76,13 @@ bool StateNamed() {
   return std::getenv("TULK_ROOT") != nullptr && access(rootFile.c_str(), F_OK) == 0;
 }
 
+// A root that is named but is not a scratch root (it resolves to "/" or
+// does not exist): the tool's records and files would land on the machine.
+bool RootUnsafe() {
+  const char* root = std::getenv("TULK_ROOT");
+  return root != nullptr && *root != '\0' && Sim::ResolvedScratchRoot().empty();
+}
+
 }  // namespace
 
 int main(int argc, char** argv) {
@@ -113,6 +120,11 @@ int main(int argc, char** argv) {
   }
   if (!StateNamed()) {
     std::fprintf(stderr, "%s: no host state (set TULK_HOST_STATE)\n", name.c_str());
+    return 1;
+  }
+  if (RootUnsafe()) {
+    std::fprintf(stderr, "%s: refusing to act on the real root (TULK_ROOT resolves to /)\n",
+                 name.c_str());
     return 1;
   }
   try {

@@ -4,6 +4,7 @@
 #include <unistd.h>
 
 #include <cerrno>
+#include <cstdlib>
 #include <cstring>
 #include <fstream>
 
@@ -87,6 +88,17 @@ std::string InstallRoot(const std::string& rootText, const std::string& tool) {
     root.pop_back();
   }
   if (root.empty() || root == "/") {
+    return "refusing to install into the real root";
+  }
+  // Whatever path leads to "/" ("/tmp/..", a link to it) is refused too;
+  // the root is created first so that a new one can be resolved.
+  if (std::string error = MakeFolders(root); !error.empty()) {
+    return error;
+  }
+  char* resolved = realpath(root.c_str(), nullptr);
+  const std::string resolvedRoot = resolved != nullptr ? resolved : "";
+  std::free(resolved);
+  if (resolvedRoot.empty() || resolvedRoot == "/") {
     return "refusing to install into the real root";
   }
   for (const char* folder : kFolders) {

@@ -13,7 +13,8 @@ namespace Sim::Tools {
 /// the script's name, so that "sh /etc/init.d/SSH status" works), and
 /// links the real sh, less, openssl, awk, ssh-keygen and the basic
 /// programs shell lines need. Idempotent: existing links and scripts are
-/// replaced. Returns an error text, empty on success.
+/// replaced. A root that is "/" or resolves to it (through "..", "." or
+/// symbolic links) is refused. Returns an error text, empty on success.
 std::string InstallRoot(const std::string& root, const std::string& tool);
 
 }  // namespace Sim::Tools
