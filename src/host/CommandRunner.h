@@ -52,16 +52,12 @@ inline constexpr std::int32_t kCaptureBufferSize = 256;
 /// Decisions of this implementation (the limits):
 /// | Limit | Seconds | Commands |
 /// |---|---|---|
-/// | kQueryTimeoutSeconds | 10 | reads: the "get" forms of osk-cmd, service "status" scripts, the
-/// certificate thumbprint (openssl), host key fingerprints (ssh-keygen) | |
-/// kPackageQueryTimeoutSeconds | 30 | the package query behind the operations agent's version test
-/// (the package database is slower to ask) | | kChangeTimeoutSeconds | 60 | changes: osk-cmd
-/// commands, tavcli settings and switch commands, service start, stop and restart, the
-/// configuration backup; the default of RunShellCommand() and RunLoggedCommand() | |
-/// kPowerCommandTimeoutSeconds | 120 | the power-off and restart command lines (on a real host they
-/// do not return) | | kResetTimeoutSeconds | 300 | the reset of the system configuration | |
-/// kPowerOffVmsTimeoutSeconds | 900 | stopping the virtual machines before a shutdown or restart
-/// (guests shut down one after another) |
+/// | kQueryTimeoutSeconds | 10 | reads: the "get" forms of osk-cmd, service "status" scripts, the certificate thumbprint (openssl), host key fingerprints (ssh-keygen) |
+/// | kPackageQueryTimeoutSeconds | 30 | the package query behind the operations agent's version test (the package database is slower to ask) |
+/// | kChangeTimeoutSeconds | 60 | changes: osk-cmd commands, tavcli settings and switch commands, service start, stop and restart, the configuration backup; the default of RunShellCommand() and RunLoggedCommand() |
+/// | kPowerCommandTimeoutSeconds | 120 | the power-off and restart command lines (on a real host they do not return) |
+/// | kResetTimeoutSeconds | 300 | the reset of the system configuration |
+/// | kPowerOffVmsTimeoutSeconds | 900 | stopping the virtual machines before a shutdown, a restart or a factory network restore (guests shut down one after another) |
 inline constexpr int kQueryTimeoutSeconds = 10;
 inline constexpr int kPackageQueryTimeoutSeconds = 30;
 inline constexpr int kChangeTimeoutSeconds = 60;

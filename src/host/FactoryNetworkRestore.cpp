@@ -35,7 +35,8 @@ bool HasRunningVirtualMachines() {
 }
 
 int PowerOffAllVirtualMachines() {
-  return RunLoggedCommand("/sbin/powerOffVms", {"powerOffVms"});
+  return RunLoggedCommand("/sbin/powerOffVms", {"powerOffVms"}, nullptr,
+                          kPowerOffVmsTimeoutSeconds);
 }
 
 HostOutcome DisableNetworkDumper() {

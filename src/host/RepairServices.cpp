@@ -30,7 +30,7 @@ int RunOskServiceCommand(const char* action, const RepairService& service) {
 
 bool IsServiceRunning(const RepairService& service) {
   return RunCommand(kShell, ScriptArguments(service, "status"), nullptr, nullptr, nullptr, nullptr,
-                    nullptr, 0, 0) == 0;
+                    nullptr, 0, kQueryTimeoutSeconds) == 0;
 }
 
 int RunServiceScript(const RepairService& service, const char* verb) {

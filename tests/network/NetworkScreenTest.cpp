@@ -96,8 +96,9 @@ TEST(NetworkWindowScreenTest, EveryEntryChangedAppliedAndSeenAgain) {
   EXPECT_EQ(network["dns"]["searchDomains"],
             Json({"lab.example.net", "a.example", "b.example", "c.example"}));
 
-  // The menu's own description and, after logging out, the welcome screen
-  // show the new address.
+  // The menu's own description (the menu is back at its first entry) and,
+  // after logging out, the welcome screen show the new address.
+  ASSERT_TRUE(NetworkTest::Select(console, "Configure Management Network"));
   EXPECT_TRUE(console.WaitForText("10.20.30.50"));
   console.Key("Esc");
   EXPECT_TRUE(Settled(console, "https://10.20.30.50/ (STATIC)"));
@@ -138,6 +139,7 @@ TEST(NetworkWindowScreenTest, LeavingAsksOnlyAfterARealChange) {
   EXPECT_FALSE(console.Contains("Configure Management Network: Confirm"));
 
   // Esc in the question keeps the edits; N drops them.
+  ASSERT_TRUE(NetworkTest::Select(console, "Configure Management Network"));
   console.Key("Enter");
   ASSERT_TRUE(Settled(console, "Custom DNS Suffixes"));
   ASSERT_TRUE(OpenDialog(console, "VLAN (optional)", "VLAN ID (1-4094"));
