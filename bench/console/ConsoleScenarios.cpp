@@ -1,55 +1,25 @@
 #include "ConsoleScenarios.h"
 
 #include <chrono>
-#include <filesystem>
-#include <fstream>
+#include <csignal>
 #include <thread>
 
+#include "BenchConsole.h"
 #include "ProcessProbe.h"
-#include "TestConsole.h"
+#include "ScratchFolder.h"
 
 namespace TulkBench {
 namespace {
 
-using Clock = std::chrono::steady_clock;
 using namespace std::chrono_literals;
 
-// Pumps output until nothing arrives for `quiet`; returns the time of the
-// last byte.
-Clock::time_point Settle(TulkTest::TestConsole& console, std::chrono::milliseconds quiet) {
-  Clock::time_point last = Clock::now();
-  std::size_t bytes = console.BytesReceived();
-  while (Clock::now() - last < quiet) {
-    console.Pump(1ms);
-    if (console.BytesReceived() != bytes) {
-      bytes = console.BytesReceived();
-      last = Clock::now();
-    }
-  }
-  return last;
-}
-
-// The demo host with console login allowed and the demo users.
-TulkTest::Options BenchOptions() {
-  TulkTest::Options options;
-  options.start = false;
-  options.pamUsers = {{"root", "tulk"}};
-  options.prepareRoot = [](const std::filesystem::path& root) {
-    std::filesystem::create_directories(root / "var/run/brimlo");
-    std::ofstream(root / "var/run/brimlo/show-tulk-login");
-  };
-  return options;
-}
+constexpr const char* kTerm = "xterm-256color";
 
 // Bytes the console writes in answer to one key, after settling.
 double BytesForKey(TulkTest::TestConsole& console, const std::string& key) {
   Settle(console, 150ms);
   std::size_t before = console.BytesReceived();
-  if (key.size() == 1) {
-    console.Type(key);
-  } else {
-    console.Key(key);
-  }
+  Press(console, key);
   Settle(console, 150ms);
   return static_cast<double>(console.BytesReceived() - before);
 }
@@ -64,92 +34,63 @@ void MeasureIdle(TulkTest::TestConsole& console, const BenchSettings& settings, 
   wakeups.values.push_back(static_cast<double>(after.contextSwitches - before.contextSwitches));
 }
 
-bool OpenLogin(TulkTest::TestConsole& console) {
-  if (!console.WaitForText("Customize System/View Logs")) {
-    return false;
-  }
-  Settle(console, 150ms);
-  console.Key("F2");
-  return console.WaitForText("Authentication Required");
-}
-
-bool LogIn(TulkTest::TestConsole& console) {
-  if (!OpenLogin(console)) {
-    return false;
-  }
-  Settle(console, 150ms);
-  console.Key("Down");
-  console.Type("tulk");
-  console.Key("Enter");
-  return console.WaitForText("System Customization");
+void Stop(TulkTest::TestConsole& console) {
+  console.Signal(SIGTERM);
+  console.WaitExit(2s);
 }
 
 }  // namespace
 
 std::vector<Figure> RunScenarios(const BenchSettings& settings) {
   const std::string idleUnit = "/" + std::to_string(settings.idleSeconds) + "s";
+  ScratchFolder pam("tulk-bench-pam");
+  const std::string pamFolder = pam.Path().string();
   std::vector<Figure> figures;
 
   Figure startup{"startup_to_settled_welcome", "ms", {}};
   Figure peak{"peak_resident_welcome", "KiB", {}};
-  Figure welcomeBytes{"welcome_screen_bytes", "bytes", {}};
   for (int run = 0; run < settings.runs; ++run) {
-    TulkTest::TestConsole console(BenchOptions());
-    Clock::time_point start = Clock::now();
+    TulkTest::TestConsole console(DemoOptions(kTerm, pamFolder));
+    BenchClock::time_point start = BenchClock::now();
     console.Start();
-    Clock::time_point settled = Settle(console, 300ms);
+    BenchClock::time_point settled = Settle(console, 300ms);
     startup.values.push_back(std::chrono::duration<double, std::milli>(settled - start).count());
     peak.values.push_back(static_cast<double>(ReadUsage(console.Pid()).peakResidentKiB));
-    welcomeBytes.values.push_back(static_cast<double>(console.BytesReceived()));
+    Stop(console);
   }
-  figures.insert(figures.end(), {startup, peak, welcomeBytes});
+  figures.insert(figures.end(), {startup, peak});
 
   Figure anyKey{"welcome_repaint_key_bytes", "bytes", {}};
   Figure idleWelcomeCpu{"idle_welcome_cpu", "ms" + idleUnit, {}};
   Figure idleWelcomeWakeups{"idle_welcome_wakeups", idleUnit, {}};
   {
-    TulkTest::TestConsole console(BenchOptions());
+    TulkTest::TestConsole console(DemoOptions(kTerm, pamFolder));
     console.Start();
     for (int run = 0; run < settings.runs; ++run) {
       anyKey.values.push_back(BytesForKey(console, "x"));
     }
     MeasureIdle(console, settings, idleWelcomeCpu, idleWelcomeWakeups);
+    Stop(console);
   }
   figures.insert(figures.end(), {anyKey, idleWelcomeCpu, idleWelcomeWakeups});
 
-  Figure firstChar{"login_name_first_char_bytes", "bytes", {}};
-  Figure nextChar{"login_name_next_char_bytes", "bytes", {}};
-  {
-    TulkTest::TestConsole console(BenchOptions());
-    console.Start();
-    if (OpenLogin(console)) {
-      firstChar.values.push_back(BytesForKey(console, "a"));
-      for (int run = 0; run < settings.runs; ++run) {
-        nextChar.values.push_back(BytesForKey(console, "b"));
-      }
-    }
-  }
-  figures.insert(figures.end(), {firstChar, nextChar});
-
-  Figure firstDown{"menu_first_down_bytes", "bytes", {}};
-  Figure anyDown{"menu_down_bytes_each_entry", "bytes", {}};
+  // Peak memory once logged in, with the demo's own PAM stack loaded.
   Figure peakMenu{"peak_resident_menu", "KiB", {}};
   Figure idleMenuCpu{"idle_menu_cpu", "ms" + idleUnit, {}};
   Figure idleMenuWakeups{"idle_menu_wakeups", idleUnit, {}};
   {
-    TulkTest::TestConsole console(BenchOptions());
+    TulkTest::TestConsole console(DemoOptions(kTerm, pamFolder));
     console.Start();
     if (LogIn(console)) {
-      firstDown.values.push_back(BytesForKey(console, "Down"));
-      anyDown.values.push_back(firstDown.values.back());
       for (int entry = 0; entry < 12; ++entry) {
-        anyDown.values.push_back(BytesForKey(console, "Down"));
+        BytesForKey(console, "Down");
       }
       peakMenu.values.push_back(static_cast<double>(ReadUsage(console.Pid()).peakResidentKiB));
       MeasureIdle(console, settings, idleMenuCpu, idleMenuWakeups);
     }
+    Stop(console);
   }
-  figures.insert(figures.end(), {firstDown, anyDown, peakMenu, idleMenuCpu, idleMenuWakeups});
+  figures.insert(figures.end(), {peakMenu, idleMenuCpu, idleMenuWakeups});
   return figures;
 }
 

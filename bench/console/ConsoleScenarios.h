@@ -9,6 +9,8 @@ namespace TulkBench {
 struct BenchSettings {
   int runs = 20;
   int idleSeconds = 10;
+  /// Runs of the byte scenarios (their figures hardly vary).
+  int byteRuns = 5;
 };
 
 /// One measured figure with its samples.
