@@ -21,7 +21,14 @@
 ///   it does not set itself, so that simulated host tools see the same root,
 ///   host state and log copy as the console.
 ///
-/// Safe to call from any thread: the runner keeps no shared state.
+/// The screen: before it starts a program, the runner sends the screen's
+/// pending changes to the terminal (FlushBeforeCommand(),
+/// runtime/ScreenFlush.h), so that what the console announces is shown
+/// before the command runs. Queries run inside a HostQueryScope and send
+/// nothing.
+///
+/// Safe to call from any thread: the runner keeps no shared state (only
+/// the main thread sends the screen).
 
 #include <cstdint>
 #include <string>

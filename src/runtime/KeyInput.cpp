@@ -13,6 +13,7 @@
 #include "include/ProcessFlags.h"
 #include "runtime/Clock.h"
 #include "runtime/RuntimeFrame.h"
+#include "runtime/ScreenFlush.h"
 #include "runtime/SignalThread.h"
 #include "runtime/SystemLog.h"
 
@@ -54,6 +55,7 @@ timeval Until(const timeval& now, const timeval& until) {
 }  // namespace
 
 int PollInput(const timeval* limit) {
+  FlushScreen();
   if (g_cursesMayHoldInput) {
     int key = ReadKeyNow();
     if (key != ERR) {
