@@ -41,8 +41,9 @@ std::map<std::string, std::string> DemoPamEnvironment(const std::string& folder)
 }  // namespace
 
 TulkTest::Options DemoOptions(const std::string& term, const std::string& pamFolder,
-                              double timeScale) {
+                              const std::string& program, double timeScale) {
   TulkTest::Options options;
+  options.program = program;
   options.start = false;
   options.term = term;
   options.timeScale = timeScale;

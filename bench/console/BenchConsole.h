@@ -17,8 +17,9 @@ using BenchClock = std::chrono::steady_clock;
 /// The demo host with console login allowed. Logins go through the demo's
 /// own PAM set-up (scripts/pam-env.sh: pam_wrapper and pam_matrix, users
 /// "root"/"tulk" and "operator"/"operator"), prepared in `pamFolder`.
+/// `program` names the console binary (empty: this build's).
 TulkTest::Options DemoOptions(const std::string& term, const std::string& pamFolder,
-                              double timeScale = 0);
+                              const std::string& program, double timeScale = 0);
 
 /// Pumps output until nothing arrives for `quiet`; returns the time of the
 /// last byte.

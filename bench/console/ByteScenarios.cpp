@@ -130,9 +130,10 @@ class TermFigures {
 
 // First screen, typing in the login dialog, login to menu, and moving down
 // the menu (only keys that moved the selection are samples).
-void MeasureSession(const TerminalProfile& profile, TermFigures& figures) {
+void MeasureSession(const TerminalProfile& profile, const std::string& program,
+                    TermFigures& figures) {
   ScratchFolder pam("tulk-bench-pam");
-  TulkTest::TestConsole console(DemoOptions(profile.term, pam.Path().string()));
+  TulkTest::TestConsole console(DemoOptions(profile.term, pam.Path().string(), program));
   console.Start();
   if (!console.WaitForText("Customize System/View Logs")) {
     return;
@@ -188,10 +189,11 @@ void MeasureSession(const TerminalProfile& profile, TermFigures& figures) {
 // A key that ends the dimmed state, on the welcome screen and in the menu.
 // The console's clock runs fast so that the minute passes in a second or
 // three.
-void MeasureDimming(const TerminalProfile& profile, TermFigures& figures) {
+void MeasureDimming(const TerminalProfile& profile, const std::string& program,
+                    TermFigures& figures) {
   ScratchFolder pam("tulk-bench-pam");
   {
-    TulkTest::TestConsole console(DemoOptions(profile.term, pam.Path().string(), 60));
+    TulkTest::TestConsole console(DemoOptions(profile.term, pam.Path().string(), program, 60));
     console.Start();
     if (console.WaitForText("Customize System/View Logs")) {
       Settle(console, 200ms);
@@ -207,7 +209,7 @@ void MeasureDimming(const TerminalProfile& profile, TermFigures& figures) {
     Stop(console);
   }
   {
-    TulkTest::TestConsole console(DemoOptions(profile.term, pam.Path().string(), 20));
+    TulkTest::TestConsole console(DemoOptions(profile.term, pam.Path().string(), program, 20));
     console.Start();
     if (LogIn(console)) {
       Settle(console, 200ms);
@@ -229,8 +231,8 @@ std::vector<Figure> RunByteScenarios(const BenchSettings& settings) {
     const TerminalProfile profile = ReadTerminalProfile(term);
     TermFigures figures(term);
     for (int run = 0; run < settings.byteRuns; ++run) {
-      MeasureSession(profile, figures);
-      MeasureDimming(profile, figures);
+      MeasureSession(profile, settings.program, figures);
+      MeasureDimming(profile, settings.program, figures);
     }
     all.insert(all.end(), figures.All().begin(), figures.All().end());
   }

@@ -8,7 +8,10 @@
 // stable for scripts.
 //
 //   tulk-console-bench [--runs N] [--byte-runs N] [--idle-seconds S]
-//                      [--only bytes|process]
+//                      [--only bytes|process] [--tulk PATH]
+//
+// --tulk measures another build of the console (an older one, say) with the
+// same yardstick.
 //
 // With TULK_BENCH_TRACE set, every measured key's bytes (escaped) and the
 // cells it changed go to standard error.
@@ -53,6 +56,8 @@ int main(int argc, char** argv) {
       settings.byteRuns = std::atoi(argv[i + 1]);
     } else if (std::strcmp(argv[i], "--idle-seconds") == 0) {
       settings.idleSeconds = std::atoi(argv[i + 1]);
+    } else if (std::strcmp(argv[i], "--tulk") == 0) {
+      settings.program = argv[i + 1];
     } else if (std::strcmp(argv[i], "--only") == 0) {
       only = argv[i + 1];
     }

@@ -16,10 +16,10 @@ const char* String(const char* name) {
 
 // The capabilities the cost model uses.
 constexpr const char* kNames[] = {
-    "cup",  "home",  "hpa",   "vpa",   "cuf",   "cuf1",  "cub",  "cub1",  "cud",
-    "cud1", "cuu",   "cuu1",  "cr",    "ech",   "el",    "ed",   "rep",   "sgr",
-    "sgr0", "bold",  "rev",   "smul",  "rmul",  "smso",  "rmso", "setaf", "setab",
-    "op",   "smacs", "rmacs", "cnorm", "civis", "smcup", "smkx", "enacs", "initc"};
+    "cup",   "home",  "hpa",   "vpa",  "cuf",   "cuf1",  "cub",   "cub1", "cud",   "cud1",
+    "cuu",   "cuu1",  "cr",    "ech",  "el",    "ed",    "rep",   "sgr",  "sgr0",  "bold",
+    "rev",   "smul",  "rmul",  "smso", "rmso",  "setaf", "setab", "op",   "smacs", "rmacs",
+    "cnorm", "civis", "smcup", "smkx", "enacs", "initc", "clear"};
 
 // The palette entries the console redefines (colour number, red, green and
 // blue in thousandths), as its start-up sets them.

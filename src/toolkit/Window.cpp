@@ -274,19 +274,20 @@ void Window::DrawDecorations() {
   }
   SetDrawingAttribute();
   // Curses enters and leaves the line-drawing set with the terminal's full
-  // attribute control, and leaves it before every cursor move: worth it
-  // for a run of line characters, far dearer than three bytes of UTF-8 for
-  // the single cell of a vertical line between other colours. So the
-  // horizontal lines and the corners go out in the set, the vertical lines
-  // in Unicode.
+  // attribute control, and leaves it (and enters it again) around every
+  // cursor move: worth it for a run of line characters, far dearer than
+  // three bytes of UTF-8 for the single cell of a vertical line between
+  // other colours, or for a corner that ends a row. So the horizontal lines
+  // and the left corners go out in the set, the vertical lines and the
+  // right corners in Unicode.
   const ColorAttribute attribute = DrawingAttribute();
   const cchar_t horizontal = LineSetCell('q', attribute);
   if (boxed_) {
     const cchar_t vertical = UnicodeCell(L'\u2502', attribute);
     const cchar_t upperLeft = LineSetCell('l', attribute);
-    const cchar_t upperRight = LineSetCell('k', attribute);
+    const cchar_t upperRight = UnicodeCell(L'\u2510', attribute);
     const cchar_t lowerLeft = LineSetCell('m', attribute);
-    const cchar_t lowerRight = LineSetCell('j', attribute);
+    const cchar_t lowerRight = UnicodeCell(L'\u2518', attribute);
     wborder_set(window_, &vertical, &vertical, &horizontal, &horizontal, &upperLeft, &upperRight,
                 &lowerLeft, &lowerRight);
   }

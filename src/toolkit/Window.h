@@ -24,10 +24,11 @@
 /// as one update. Nothing of a top-level window is copied before its first
 /// Redraw(), so a frame can fill its texts in its constructor.
 ///
-/// Horizontal lines and the corners of boxes are drawn in the terminal's
-/// own line-drawing set where its description has one (curses sends the
-/// Unicode line characters where it has none); the sides of a box are
-/// Unicode line characters, which cost fewer bytes one cell at a time.
+/// Horizontal lines and the left corners of boxes are drawn in the
+/// terminal's own line-drawing set where its description has one (curses
+/// sends the Unicode line characters where it has none); the sides and the
+/// right corners of a box are Unicode line characters, which cost fewer
+/// bytes one cell at a time.
 ///
 /// The terminal cursor is process-wide state (runtime/ScreenFlush.h):
 /// MoveCursor() and ShowCursor() set it; it reaches the terminal with the
