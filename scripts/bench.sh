@@ -1,12 +1,16 @@
 #!/usr/bin/env bash
 # Builds the release configuration and runs every benchmark:
 #   - the whole console in a pseudo-terminal (bench/console): start-up to a
-#     settled screen, peak memory, bytes written per key, idle cost;
+#     settled screen, peak memory (in the menu with the demo's PAM set-up),
+#     idle cost, the lone Esc, and on xterm-256color and vt102 the bytes of
+#     the first screen, a typed character, login to menu, a Down in the menu
+#     and a key that ends the dimmed state, each against the fewest bytes
+#     that make the same change (bench/console/ScreenCost.h);
 #   - Google Benchmark suites of the renderer, host layer, simulated host and
 #     menu (bench/render, bench/host, bench/platform, bench/screens).
 # Output format: the console benchmark prints "figure median min max unit"
 # lines; the others print Google Benchmark's console table.
-#   scripts/bench.sh [--runs N] [--idle-seconds S]
+#   scripts/bench.sh [--runs N] [--byte-runs N] [--idle-seconds S]
 set -euo pipefail
 cd "$(dirname "$0")/.."
 scripts/setup.sh
