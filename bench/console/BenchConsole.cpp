@@ -73,7 +73,7 @@ Screen Capture(const TulkTest::TestConsole& console, int rows, int cols) {
   Screen screen;
   screen.rows = rows;
   screen.cols = cols;
-  screen.cells.reserve(static_cast<std::size_t>(rows * cols));
+  screen.cells.reserve(static_cast<std::size_t>(rows) * static_cast<std::size_t>(cols));
   for (int row = 0; row < rows; ++row) {
     for (int col = 0; col < cols; ++col) {
       screen.cells.push_back(console.At(row, col));

@@ -44,22 +44,22 @@ void Trace(const std::string& key, const Change& change, const std::string& byte
     const auto code = static_cast<unsigned char>(ch);
     if (code < 32 || code >= 127) {
       char hex[8];
-      std::snprintf(hex, sizeof hex, "\\x%02x", code);
+      (void)std::snprintf(hex, sizeof hex, "\\x%02x", code);
       escaped += hex;
     } else {
       escaped += ch;
     }
   }
-  std::fprintf(stderr, "key %s: %g bytes, fewest %g\n  %s\n", key.c_str(), change.bytes,
-               change.fewest, escaped.c_str());
+  (void)std::fprintf(stderr, "key %s: %g bytes, fewest %g\n  %s\n", key.c_str(), change.bytes,
+                     change.fewest, escaped.c_str());
   for (int row = 0; row < kRows; ++row) {
     for (int col = 0; col < kCols; ++col) {
       const TulkTest::Cell& a = before.At(row, col);
       const TulkTest::Cell& b = after.At(row, col);
       if (!LooksSame(a, b)) {
-        std::fprintf(stderr, "  %d,%d '%s' %d/%d%s -> '%s' %d/%d%s\n", row, col, a.text.c_str(),
-                     a.fg, a.bg, a.reverse ? " reverse" : "", b.text.c_str(), b.fg, b.bg,
-                     b.reverse ? " reverse" : "");
+        (void)std::fprintf(stderr, "  %d,%d '%s' %d/%d%s -> '%s' %d/%d%s\n", row, col,
+                           a.text.c_str(), a.fg, a.bg, a.reverse ? " reverse" : "", b.text.c_str(),
+                           b.fg, b.bg, b.reverse ? " reverse" : "");
       }
     }
   }

@@ -404,8 +404,8 @@ State UpdateRow(const Encoder& encoder, const State& state, const Screen& target
 State PaintScreen(const Encoder& encoder, State state, const Screen& target,
                   const std::vector<Cell>& shown) {
   for (int row = 0; row < target.rows; ++row) {
-    std::vector<Cell> line(shown.begin() + row * target.cols,
-                           shown.begin() + (row + 1) * target.cols);
+    const auto start = static_cast<std::ptrdiff_t>(row) * target.cols;
+    std::vector<Cell> line(shown.begin() + start, shown.begin() + start + target.cols);
     state = UpdateRow(encoder, state, target, line, row);
   }
   return state;
@@ -417,7 +417,8 @@ Screen BlankScreen(int rows, int cols) {
   Screen screen;
   screen.rows = rows;
   screen.cols = cols;
-  screen.cells.assign(static_cast<std::size_t>(rows * cols), Cell{" ", -1, -1});
+  screen.cells.assign(static_cast<std::size_t>(rows) * static_cast<std::size_t>(cols),
+                      Cell{" ", -1, -1});
   screen.cursor = TulkTest::CursorState{0, 0, true};
   return screen;
 }

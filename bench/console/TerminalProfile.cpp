@@ -11,7 +11,9 @@ namespace {
 
 const char* String(const char* name) {
   char* value = tigetstr(name);
-  return value == reinterpret_cast<char*>(-1) ? nullptr : value;
+  // terminfo marks a name that is not a string capability with (char*) -1.
+  const auto notString = reinterpret_cast<char*>(-1);  // NOLINT(performance-no-int-to-ptr)
+  return value == notString ? nullptr : value;
 }
 
 // The capabilities the cost model uses.

@@ -47,8 +47,6 @@ bool Clip(int& start, int& length, int low, int high) {
 
 Window::DrawBatch::DrawBatch() = default;
 
-Window::DrawBatch::~DrawBatch() = default;
-
 Window::Window(int column, int row, int width, int height, int background, int foreground)
     : background_(background), foreground_(foreground) {
   if (Clip(column, width, 0, COLS) && Clip(row, height, 0, LINES)) {

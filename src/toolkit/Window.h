@@ -137,7 +137,7 @@ class Window {
   class DrawBatch {
    public:
     DrawBatch();
-    ~DrawBatch();
+    ~DrawBatch() = default;
     DrawBatch(const DrawBatch&) = delete;
     DrawBatch& operator=(const DrawBatch&) = delete;
   };
