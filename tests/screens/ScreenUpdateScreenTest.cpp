@@ -2,6 +2,8 @@
 // terminal has one, and one update per key, never a picture that the same
 // key paints over.
 
+#include <signal.h>
+
 #include <string>
 
 #include "SessionTestSupport.h"
@@ -23,6 +25,13 @@ int Occurrences(const std::string& text, const std::string& part) {
     ++count;
   }
   return count;
+}
+
+// Ends the console as a terminating signal does, so that pam_wrapper
+// removes its state folder.
+void Close(TestConsole& console) {
+  console.Signal(SIGTERM);
+  EXPECT_EQ(console.WaitExit(), 0);
 }
 
 std::string Repeated(const std::string& text, int times) {
@@ -53,6 +62,7 @@ TEST(ScreenUpdateScreenTest, HorizontalLinesGoOutInTheTerminalsLineDrawingSet) {
     EXPECT_EQ(console.Row(24), "\u2514" + Repeated("\u2500", 78) + "\u2518") << c.term;
     EXPECT_EQ(console.At(1, 0).text, "\u2502") << c.term;
     EXPECT_EQ(console.At(1, 79).text, "\u2502") << c.term;
+    Close(console);
   }
 }
 
@@ -72,6 +82,7 @@ TEST(ScreenUpdateScreenTest, LoginSendsTheMenuWithoutTheWelcomeScreenBetween) {
   // Drawing the welcome screen active again between the dialog and the
   // menu would send its footer once more.
   EXPECT_EQ(console.Output().find(kWelcomeFooter, before), std::string::npos);
+  Close(console);
 }
 
 TEST(ScreenUpdateScreenTest, KeyThatEndsTheDimmedStateSendsTheScreenOnce) {
@@ -92,6 +103,7 @@ TEST(ScreenUpdateScreenTest, KeyThatEndsTheDimmedStateSendsTheScreenOnce) {
   // Both the key read's repaint and the welcome screen's own one are asked
   // for; they go out as one.
   EXPECT_EQ(Occurrences(console.Output().substr(before), kWelcomeFooter), 1);
+  Close(console);
 }
 
 }  // namespace
