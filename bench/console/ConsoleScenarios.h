@@ -9,6 +9,10 @@ namespace TulkBench {
 struct BenchSettings {
   int runs = 20;
   int idleSeconds = 10;
+  /// Runs of the byte scenarios (their figures hardly vary).
+  int byteRuns = 5;
+  /// The console binary to measure; empty: the tulk of this build.
+  std::string program;
 };
 
 /// One measured figure with its samples.

@@ -20,6 +20,7 @@
 #include <utility>
 
 #include "runtime/HostPath.h"
+#include "runtime/ScreenFlush.h"
 #include "runtime/SystemLog.h"
 
 extern char** environ;
@@ -415,6 +416,8 @@ void ReadCapture(Capture& capture) {
 int Run(const std::string& program, const std::vector<std::string>& arguments, char* output,
         std::int32_t* outputLength, char* error, std::int32_t* errorLength, const char* input,
         std::int32_t inputLength, int timeoutSeconds, const std::vector<std::string>* environment) {
+  // What the screen announces is on the terminal before the command runs.
+  FlushBeforeCommand();
   Capture out(output, outputLength);
   Capture err(error, errorLength);
   Pipe in;

@@ -30,7 +30,14 @@
 /// the limit in seconds), so that tests of hung commands need not wait for
 /// the full limits.
 ///
-/// Safe to call from any thread: the runner keeps no shared state.
+/// The screen: before it starts a program, the runner sends the screen's
+/// pending changes to the terminal (FlushBeforeCommand(),
+/// runtime/ScreenFlush.h), so that what the console announces is shown
+/// before the command runs. Queries run inside a HostQueryScope and send
+/// nothing.
+///
+/// Safe to call from any thread: the runner keeps no shared state (only
+/// the main thread sends the screen).
 
 #include <cstdint>
 #include <string>

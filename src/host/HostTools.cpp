@@ -6,6 +6,7 @@
 #include "include/ProcessFlags.h"
 #include "platform/api/AdvancedOption.h"
 #include "platform/api/HostMgrException.h"
+#include "runtime/HostQueryScope.h"
 #include "runtime/SystemLog.h"
 
 namespace Tulk {
@@ -82,6 +83,7 @@ int RunOskCommand(const std::string& command) {
 }
 
 int RunOskCmdGet(const std::string& path, std::string& value) {
+  HostQueryScope query;
   Log(LOG_INFO, "osk-cmd invocation: get %s", path.c_str());
   std::string output;
   int rc = RunOskCmd({"osk-cmd", "-U", ConsoleUser(), "get", path}, &output, kQueryTimeoutSeconds);

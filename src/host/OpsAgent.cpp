@@ -5,6 +5,7 @@
 
 #include "host/CommandRunner.h"
 #include "runtime/HostPath.h"
+#include "runtime/HostQueryScope.h"
 #include "runtime/SystemLog.h"
 
 namespace Tulk {
@@ -46,6 +47,7 @@ bool StopOpsAgent() {
 }
 
 bool IsOpsAgentPresent() {
+  HostQueryScope query;
   bool present = access(HostPath(kInitScript).c_str(), F_OK) == 0 &&
                  RunCommand(kInitScript, {kInitScript, "status"}, nullptr, nullptr, nullptr,
                             nullptr, nullptr, 0, kQueryTimeoutSeconds) == 0;
@@ -62,6 +64,7 @@ bool StartOpsAgentIfPresent() {
 }
 
 bool IsOpsAgentVersion3OrLater() {
+  HostQueryScope query;
   Log(LOG_INFO, "Running: %s", kVersionCommand);
   if (RunShellCommand(kVersionCommand, kPackageQueryTimeoutSeconds) != 0) {
     return false;

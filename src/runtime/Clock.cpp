@@ -1,5 +1,7 @@
 #include "runtime/Clock.h"
 
+#include <time.h>
+
 #include <cmath>
 #include <cstdlib>
 
@@ -16,6 +18,18 @@ double ReadScale() {
   return (end != text && scale > 0.0) ? scale : 1.0;
 }
 
+// The time since boot; it never steps.
+timeval SteadyNow() {
+  timespec now{};
+  if (clock_gettime(CLOCK_BOOTTIME, &now) != 0) {
+    clock_gettime(CLOCK_MONOTONIC, &now);
+  }
+  timeval result{};
+  result.tv_sec = now.tv_sec;
+  result.tv_usec = static_cast<suseconds_t>(now.tv_nsec / 1000);
+  return result;
+}
+
 double ToSeconds(const timeval& tv) {
   return static_cast<double>(tv.tv_sec) + static_cast<double>(tv.tv_usec) / 1e6;
 }
@@ -28,8 +42,7 @@ double Clock::Scale() {
 }
 
 timeval Clock::Now() {
-  timeval real{};
-  gettimeofday(&real, nullptr);
+  const timeval real = SteadyNow();
   if (Scale() == 1.0) {
     return real;
   }

@@ -69,7 +69,8 @@ void StartCurses() {
   cbreak();
   noecho();
   keypad(stdscr, TRUE);
-  set_escdelay(kEscDelayMs);
+  set_escdelay(EscapeDelay(std::getenv("ESCDELAY")));
+  DisableFlowControl();
 }
 
 }  // namespace

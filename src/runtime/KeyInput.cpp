@@ -15,6 +15,7 @@
 #include "runtime/Clock.h"
 #include "runtime/ReadySignal.h"
 #include "runtime/RuntimeFrame.h"
+#include "runtime/ScreenFlush.h"
 #include "runtime/SignalThread.h"
 #include "runtime/SystemLog.h"
 #include "runtime/WorkerResult.h"
@@ -72,6 +73,7 @@ timeval Until(const timeval& now, const timeval& until) {
 }  // namespace
 
 int PollInput(const timeval* limit, int wakeFd) {
+  FlushScreen();
   if (g_cursesMayHoldInput) {
     int key = ReadKeyNow();
     if (key != ERR) {

@@ -47,4 +47,21 @@ void DefineKeys() {
   }
 }
 
+int EscapeDelay(const char* environmentValue) {
+  if (environmentValue == nullptr || *environmentValue == '\0') {
+    return kEscDelayMs;
+  }
+  long value = 0;
+  for (const char* digit = environmentValue; *digit != '\0'; ++digit) {
+    if (*digit < '0' || *digit > '9') {
+      return kEscDelayMs;
+    }
+    value = value * 10 + (*digit - '0');
+    if (value > kMaxEscDelayMs) {
+      return kEscDelayMs;
+    }
+  }
+  return static_cast<int>(value);
+}
+
 }  // namespace Tulk

@@ -24,4 +24,13 @@ void DefineKeys();
 /// (about one millisecond a byte), short enough that Esc acts at once.
 inline constexpr int kEscDelayMs = 25;
 
+/// Longest escape delay taken from the environment, in milliseconds.
+inline constexpr int kMaxEscDelayMs = 60000;
+
+/// The escape delay to use, given the value of ESCDELAY in the environment
+/// (null when unset): that value when it is a whole number of milliseconds
+/// from 0 to kMaxEscDelayMs, so that a slow remote line that splits escape
+/// sequences can be given more time; kEscDelayMs otherwise.
+int EscapeDelay(const char* environmentValue);
+
 }  // namespace Tulk

@@ -1,5 +1,6 @@
 #include "runtime/Terminal.h"
 
+#include <curses.h>
 #include <fcntl.h>
 #include <linux/kd.h>
 #include <linux/vt.h>
@@ -68,6 +69,17 @@ void SwitchToVt(int vt) {
     ioctl(fd, VT_WAITACTIVE, vt);
   }
   close(fd);
+}
+
+void DisableFlowControl() {
+  termios attributes{};
+  if (tcgetattr(0, &attributes) != 0) {
+    return;
+  }
+  attributes.c_iflag &= ~static_cast<tcflag_t>(IXON | IXOFF);
+  if (tcsetattr(0, TCSANOW, &attributes) == 0) {
+    def_prog_mode();
+  }
 }
 
 void DisableSuspendCharacter() {

@@ -40,4 +40,12 @@ void SwitchToVt(int vt);
 /// to standard output at once.
 void DisableSuspendCharacter();
 
+/// Switches off XON/XOFF flow control on the terminal (IXON, IXOFF), once
+/// curses has started: Ctrl-S then reaches the console as a key instead of
+/// stopping its output, and nothing (a terminating signal included) waits
+/// for a Ctrl-Q. Curses' program mode takes the change, so it survives
+/// every later mode switch; endwin() restores the terminal as it was at
+/// start-up, flow control included.
+void DisableFlowControl();
+
 }  // namespace Tulk

@@ -10,6 +10,7 @@
 #include "host/CommandRunner.h"
 #include "render/HostValues.h"
 #include "runtime/HostPath.h"
+#include "runtime/HostQueryScope.h"
 #include "runtime/SystemLog.h"
 #include "screens/FileValueCache.h"
 
@@ -48,6 +49,7 @@ std::string SecondWord(const std::string& output) {
 }
 
 std::string CertificateThumbprint(unsigned bits) {
+  HostQueryScope query;
   char option[16];
   std::snprintf(option, sizeof option, "-SHA%u", bits);
   char output[kCaptureBufferSize] = {};
@@ -69,6 +71,7 @@ std::string CertificateThumbprint(unsigned bits) {
 }
 
 std::string HostKeyFingerprint(const std::string& keyPath) {
+  HostQueryScope query;
   char output[kCaptureBufferSize] = {};
   char error[kCaptureBufferSize] = {};
   std::int32_t outputLength = kCaptureBufferSize;

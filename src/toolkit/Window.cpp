@@ -4,19 +4,34 @@
 
 #include "include/ColorNumbers.h"
 #include "runtime/Palette.h"
+#include "runtime/ScreenFlush.h"
 
 namespace Tulk {
 namespace {
 
-struct ProcessCursor {
-  bool visible = false;
-  int column = 0;
-  int row = 0;
-};
+// A character of the terminal's line-drawing set, by its key ("q" the
+// horizontal line, "l", "k", "m", "j" the corners), with the colours of
+// `attribute`. Curses sends it in the terminal's line-drawing set where the
+// description has one, and as the Unicode line character where it has
+// none. (The WACS_ characters go out as three bytes of UTF-8 in a UTF-8
+// locale, and the narrow ACS_ ones keep only 8 bits of the colour pair,
+// which reaches 1800 here.)
+cchar_t LineSetCell(char key, const ColorAttribute& attribute) {
+  const wchar_t text[] = {static_cast<wchar_t>(key), L'\0'};
+  int pair = attribute.pair;
+  cchar_t cell{};
+  setcchar(&cell, text, attribute.attrs | A_ALTCHARSET, static_cast<short>(pair), &pair);
+  return cell;
+}
 
-ProcessCursor g_cursor;
-int g_batchDepth = 0;
-bool g_flushPending = false;
+// A Unicode character with the colours of `attribute`.
+cchar_t UnicodeCell(wchar_t character, const ColorAttribute& attribute) {
+  const wchar_t text[] = {character, L'\0'};
+  int pair = attribute.pair;
+  cchar_t cell{};
+  setcchar(&cell, text, attribute.attrs, static_cast<short>(pair), &pair);
+  return cell;
+}
 
 // Cuts [start, start + length) to [low, high); returns false when empty.
 bool Clip(int& start, int& length, int low, int high) {
@@ -30,33 +45,7 @@ bool Clip(int& start, int& length, int low, int high) {
 
 }  // namespace
 
-Window::DrawBatch::DrawBatch() {
-  ++g_batchDepth;
-}
-
-Window::DrawBatch::~DrawBatch() {
-  if (--g_batchDepth == 0) {
-    FinishOutput();
-  }
-}
-
-void Window::FinishOutput() {
-  // Typed-ahead keys are dropped before the new state reaches the screen,
-  // so that a key pressed after the operator saw it is kept.
-  if (g_flushPending) {
-    g_flushPending = false;
-    flushinp();
-  }
-  if (newscr != nullptr) {
-    // A hidden cursor is left where drawing ended instead of being moved
-    // back: fewer bytes on a slow line.
-    leaveok(newscr, g_cursor.visible ? FALSE : TRUE);
-    if (g_cursor.visible) {
-      wmove(newscr, g_cursor.row, g_cursor.column);
-    }
-  }
-  doupdate();
-}
+Window::DrawBatch::DrawBatch() = default;
 
 Window::Window(int column, int row, int width, int height, int background, int foreground)
     : background_(background), foreground_(foreground) {
@@ -95,6 +84,9 @@ void Window::Create(WINDOW* window) {
     height_ = 0;
     return;
   }
+  // Curses clears the whole terminal before it first draws a window of
+  // the screen's full size; the cells that really change are enough.
+  clearok(window_, FALSE);
   ApplyBackground(true);
   werase(window_);
 }
@@ -126,13 +118,12 @@ void Window::ApplyBackground(bool active) {
 }
 
 void Window::Redraw(bool active) {
-  DrawBatch batch;
-  g_flushPending = true;
+  DropTypeaheadAtFlush();
   // The cursor is handed over only when the window changes state: a window
   // drawn active again keeps the cursor its screen has just shown.
   const bool wasActive = active_;
   if (parent_ == nullptr && !active && wasActive) {
-    savedCursor_ = CursorState{g_cursor.visible, g_cursor.column, g_cursor.row};
+    savedCursor_ = ScreenCursor();
     ShowCursor(false);
   }
   active_ = active;
@@ -149,8 +140,7 @@ void Window::Redraw(bool active) {
   DrawDecorations();
   Update();
   if (parent_ == nullptr && active && !wasActive) {
-    g_cursor = ProcessCursor{savedCursor_.visible, savedCursor_.column, savedCursor_.row};
-    curs_set(g_cursor.visible ? 1 : 0);
+    SetScreenCursor(savedCursor_);
   }
 }
 
@@ -161,7 +151,6 @@ void Window::RepaintContents() {
   if (window_ == nullptr) {
     return;
   }
-  DrawBatch batch;
   ApplyBackground(active_);
   werase(window_);
   PaintContents(active_);
@@ -206,9 +195,6 @@ void Window::Update() {
   }
   Touch();
   wnoutrefresh(window_);
-  if (g_batchDepth == 0) {
-    FinishOutput();
-  }
 }
 
 void Window::RedrawLines() {
@@ -265,9 +251,12 @@ void Window::HorizontalLine(int column, int row, int length) {
   DrawDecorations();
 }
 
+ColorAttribute Window::DrawingAttribute() const {
+  return active_ ? ColorAttr(background_, foreground_) : ColorAttr(kBlack, kDarkGrey);
+}
+
 void Window::SetDrawingAttribute() {
-  SetWindowAttribute(window_,
-                     active_ ? ColorAttr(background_, foreground_) : ColorAttr(kBlack, kDarkGrey));
+  SetWindowAttribute(window_, DrawingAttribute());
 }
 
 void Window::DrawTexts() {
@@ -282,37 +271,47 @@ void Window::DrawDecorations() {
     return;
   }
   SetDrawingAttribute();
-  // The wide-character calls: the narrow ones keep only 8 bits of the
-  // colour pair, and pair numbers reach 1800.
+  // Curses enters and leaves the line-drawing set with the terminal's full
+  // attribute control, and leaves it (and enters it again) around every
+  // cursor move: worth it for a run of line characters, far dearer than
+  // three bytes of UTF-8 for the single cell of a vertical line between
+  // other colours, or for a corner that ends a row. So the horizontal lines
+  // and the left corners go out in the set, the vertical lines and the
+  // right corners in Unicode.
+  const ColorAttribute attribute = DrawingAttribute();
+  const cchar_t horizontal = LineSetCell('q', attribute);
   if (boxed_) {
-    wborder_set(window_, nullptr, nullptr, nullptr, nullptr, nullptr, nullptr, nullptr, nullptr);
+    const cchar_t vertical = UnicodeCell(L'\u2502', attribute);
+    const cchar_t upperLeft = LineSetCell('l', attribute);
+    const cchar_t upperRight = UnicodeCell(L'\u2510', attribute);
+    const cchar_t lowerLeft = LineSetCell('m', attribute);
+    const cchar_t lowerRight = UnicodeCell(L'\u2518', attribute);
+    wborder_set(window_, &vertical, &vertical, &horizontal, &horizontal, &upperLeft, &upperRight,
+                &lowerLeft, &lowerRight);
   }
   for (const Line& line : lines_) {
-    mvwhline_set(window_, line.row, line.column, WACS_HLINE, line.length);
+    mvwhline_set(window_, line.row, line.column, &horizontal, line.length);
   }
 }
 
 void Window::MoveCursor(int column, int row) {
-  g_cursor.column = column_ + column;
-  g_cursor.row = row_ + row;
+  ScreenCursorState cursor = ScreenCursor();
+  cursor.column = column_ + column;
+  cursor.row = row_ + row;
+  SetScreenCursor(cursor);
   if (window_ != nullptr) {
     wmove(window_, row, column);
-  }
-  if (g_batchDepth == 0) {
-    FinishOutput();
   }
 }
 
 void Window::ShowCursor(bool visible) {
-  g_cursor.visible = visible;
-  curs_set(visible ? 1 : 0);
-  if (visible && g_batchDepth == 0) {
-    FinishOutput();
-  }
+  ScreenCursorState cursor = ScreenCursor();
+  cursor.visible = visible;
+  SetScreenCursor(cursor);
 }
 
 bool Window::CursorVisible() {
-  return g_cursor.visible;
+  return ScreenCursor().visible;
 }
 
 }  // namespace Tulk

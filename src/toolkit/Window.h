@@ -17,23 +17,34 @@
 /// children always show their own colours, active or dimmed, in colour and
 /// in monochrome.
 ///
-/// Drawing reaches the terminal once per outermost drawing operation: the
-/// windows are copied to the virtual screen as they are drawn and curses
-/// sends only the cells that changed when the operation ends. Nothing of a
-/// top-level window reaches the terminal before its first Redraw(), so a
-/// frame can fill its texts in its constructor.
+/// Drawing only changes curses' picture of the screen: the windows are
+/// copied to it as they are drawn, and the terminal gets the cells that
+/// changed when the console is about to wait for a key or a command
+/// (runtime/ScreenFlush.h). Everything one key does reaches the terminal
+/// as one update. Nothing of a top-level window is copied before its first
+/// Redraw(), so a frame can fill its texts in its constructor.
 ///
-/// The terminal cursor is process-wide state: MoveCursor() and
-/// ShowCursor() remember it; a top-level window saves it when it is dimmed
-/// and puts it back when it is drawn active again (a window that was active
-/// already leaves the cursor as it is). The dimmed owner hides the cursor,
-/// so a frame opened above it starts with the cursor hidden.
+/// Horizontal lines and the left corners of boxes are drawn in the
+/// terminal's own line-drawing set where its description has one (curses
+/// sends the Unicode line characters where it has none); the sides and the
+/// right corners of a box are Unicode line characters, which cost fewer
+/// bytes one cell at a time.
+///
+/// The terminal cursor is process-wide state (runtime/ScreenFlush.h):
+/// MoveCursor() and ShowCursor() set it; it reaches the terminal with the
+/// screen. A top-level window saves it when it is dimmed and puts it back
+/// when it is drawn active again (a window that was active already leaves
+/// the cursor as it is). The dimmed owner hides the cursor, so a frame
+/// opened above it starts with the cursor hidden.
 
 #include <curses.h>
 
 #include <string>
 #include <string_view>
 #include <vector>
+
+#include "runtime/Palette.h"
+#include "runtime/ScreenFlush.h"
 
 namespace Tulk {
 
@@ -67,8 +78,8 @@ class Window {
   /// the dimmed look, dark grey on black (standout in monochrome). Repaints
   /// the window and its children and refreshes them; a top-level window
   /// also saves (inactive) or restores (active) the cursor state. Typed-
-  /// ahead keys are discarded in both cases: keys pressed while a window
-  /// changes state are dropped.
+  /// ahead keys are discarded in both cases, as the new state is sent:
+  /// keys pressed while a window changes state are dropped.
   virtual void Redraw(bool active);
 
   /// Stores new colours (-1 keeps the parent's) and, when the window is
@@ -77,8 +88,9 @@ class Window {
   void SetColors(int background, int foreground);
   /// Marks every line of the window as changed.
   void Touch();
-  /// Touch(), then refresh the window on the terminal (once its top-level
-  /// window has been drawn).
+  /// Touch(), then copy the window to curses' picture of the screen (once
+  /// its top-level window has been drawn); the terminal gets it with the
+  /// next update.
   void Update();
   /// Has the terminal repaint the window's lines and its children's.
   void RedrawLines();
@@ -94,10 +106,9 @@ class Window {
   /// Draws a horizontal line of `length` cells and keeps it.
   void HorizontalLine(int column, int row, int length);
 
-  /// Moves the terminal cursor to `column`, `row` of this window and
-  /// remembers the screen position.
+  /// Puts the terminal cursor at `column`, `row` of this window.
   void MoveCursor(int column, int row);
-  /// Shows or hides the terminal cursor and remembers it.
+  /// Shows or hides the terminal cursor.
   static void ShowCursor(bool visible);
   /// Whether the terminal cursor is currently shown.
   static bool CursorVisible();
@@ -120,13 +131,13 @@ class Window {
   /// The window was last drawn active.
   bool Active() const { return active_; }
 
-  /// Groups drawing: while one exists, windows are only copied to the
-  /// virtual screen; the terminal is updated once, when the outermost group
-  /// ends. Every drawing operation of the toolkit opens one.
+  /// Marks the steps of one drawing operation. Nothing reaches the
+  /// terminal before the console waits, so a group does not change what
+  /// is sent; it remains for the code that marks its operations with it.
   class DrawBatch {
    public:
     DrawBatch();
-    ~DrawBatch();
+    ~DrawBatch() = default;
     DrawBatch(const DrawBatch&) = delete;
     DrawBatch& operator=(const DrawBatch&) = delete;
   };
@@ -145,11 +156,6 @@ class Window {
   void ApplyBackground(bool active);
 
  private:
-  struct CursorState {
-    bool visible = false;
-    int column = 0;
-    int row = 0;
-  };
   struct KeptText {
     int column;
     int row;
@@ -162,13 +168,13 @@ class Window {
   };
 
   void Create(WINDOW* window);
+  ColorAttribute DrawingAttribute() const;
   void SetDrawingAttribute();
   void DrawTexts();
   void DrawDecorations();
   static void WriteClipped(WINDOW* window, int column, int row, std::string_view text);
-  static void FinishOutput();
 
-  CursorState savedCursor_;
+  ScreenCursorState savedCursor_;
   Window* parent_ = nullptr;
   WINDOW* window_ = nullptr;
   int column_ = 0;

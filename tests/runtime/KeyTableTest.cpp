@@ -35,4 +35,26 @@ TEST(KeyTable, RegistrationOrderStartsWithResizeAndEndsWithBackspace) {
   EXPECT_STREQ(table.back().sequence, "\x7f");
 }
 
+TEST(KeyTable, EscapeDelayComesFromTheEnvironmentOnlyWhenItIsAWholeNumber) {
+  struct Case {
+    const char* value;  // null: unset
+    int delay;
+  };
+  const Case cases[] = {
+      {nullptr, Tulk::kEscDelayMs},
+      {"", Tulk::kEscDelayMs},
+      {"0", 0},
+      {"1000", 1000},
+      {"60000", 60000},
+      {"60001", Tulk::kEscDelayMs},
+      {"-5", Tulk::kEscDelayMs},
+      {"12ms", Tulk::kEscDelayMs},
+      {" 12", Tulk::kEscDelayMs},
+      {"99999999999999999999", Tulk::kEscDelayMs},
+  };
+  for (const Case& c : cases) {
+    EXPECT_EQ(Tulk::EscapeDelay(c.value), c.delay) << (c.value != nullptr ? c.value : "unset");
+  }
+}
+
 }  // namespace

@@ -203,4 +203,31 @@ TEST(MenuDialogScreenTest, IdleTimeoutLeavesTheMenuFromAnOpenDialog) {
   EXPECT_TRUE(console.WaitForText("result: -1"));
 }
 
+TEST(MenuDialogScreenTest, ProgressTextIsOnTheScreenWhileTheResetRuns) {
+  Json host = DemoHostState();
+  // The reset runs long enough for the screen to be read meanwhile.
+  host["commands"]["firmwareConfig.py --reset-only"] = {{"exitCode", 1}, {"delayMs", 60000}};
+  TestConsole console(DriverOptions(host, "restore"));
+  ASSERT_TRUE(MenuTest::Settled(console, "Reset System Configuration now?"));
+  console.Key("F11");
+  pid_t tool = -1;
+  ASSERT_TRUE(MenuTest::WaitUntil(
+      console,
+      [&] {
+        for (const Json& record : TulkTest::SimRecords(console.Root(), "commands.jsonl")) {
+          if (record["argv"].size() > 1 && record["argv"][1] == "--reset-only") {
+            tool = record["pid"].get<pid_t>();
+          }
+        }
+        return tool > 0;
+      },
+      "the reset started"));
+  // The console sent what it announces before it started the command.
+  console.Pump();
+  EXPECT_TRUE(console.Contains("Please wait while the default settings are restored."))
+      << console.Dump();
+  kill(tool, SIGKILL);
+  EXPECT_TRUE(console.WaitForTextGone("Please wait while the default settings"));
+}
+
 }  // namespace

@@ -6,6 +6,7 @@
 #include "../render/CursesTestScreen.h"
 #include "include/ColorNumbers.h"
 #include "include/ProcessFlags.h"
+#include "runtime/ScreenFlush.h"
 #include "toolkit/Dialog.h"
 #include "toolkit/ItemList.h"
 #include "toolkit/RootWindow.h"
@@ -16,14 +17,35 @@ namespace {
 using namespace Tulk;
 using TulkTest::CellAt;
 
+// Sends the drawing to the (null) terminal, as the console does before it
+// waits, so that the terminal's image (curscr) shows it.
+void Send() {
+  FlushScreen();
+}
+
 std::pair<int, int> ScreenColors(int row, int col) {
   TulkTest::CellInfo cell = CellAt(curscr, row, col);
   return {cell.background, cell.foreground};
 }
 
-// The line-drawing character on the screen.
+// The line-drawing character on the screen. A cell of the terminal's
+// line-drawing set holds the set's key ("l" for the upper left corner);
+// curses' own table gives its Unicode character.
 std::string LineAt(int row, int col) {
-  return CellAt(curscr, row, col).text;
+  cchar_t cell;
+  wchar_t text[CCHARW_MAX + 1] = {};
+  attr_t attrs = 0;
+  short pair = 0;
+  if (mvwin_wch(curscr, row, col, &cell) == ERR ||
+      getcchar(&cell, text, &attrs, &pair, nullptr) == ERR) {
+    return {};
+  }
+  if ((attrs & A_ALTCHARSET) != 0 && text[0] < 128) {
+    getcchar(NCURSES_WACS(text[0]), text, &attrs, &pair, nullptr);
+  }
+  char bytes[8] = {};
+  std::snprintf(bytes, sizeof bytes, "%lc", static_cast<wint_t>(text[0]));
+  return bytes;
 }
 
 class TestMenu : public RootWindow {
@@ -74,6 +96,7 @@ TEST_F(WindowTest, DialogDrawsItsPartsInTheirColoursAndDimsAsAWhole) {
   dialog.SetTitle("Title");
   dialog.SetFooter(Footer::kOk);
   dialog.Redraw(true);
+  Send();
   EXPECT_EQ(ScreenColors(6, 10), std::make_pair(kBlack, kWhite));  // box corner
   EXPECT_EQ(LineAt(6, 10), "\u250c");
   EXPECT_EQ(ScreenColors(7, 13), std::make_pair(kDarkGrey, kWhite));  // title
@@ -87,10 +110,12 @@ TEST_F(WindowTest, DialogDrawsItsPartsInTheirColoursAndDimsAsAWhole) {
   EXPECT_EQ(ScreenColors(17, 67), std::make_pair(kYellow, kDarkGrey));
 
   dialog.Redraw(false);
+  Send();
   for (auto [row, col] : {std::pair{6, 10}, {7, 13}, {13, 11}, {13, 13}, {17, 58}, {17, 67}}) {
     EXPECT_EQ(ScreenColors(row, col), std::make_pair(kBlack, kDarkGrey)) << row << "," << col;
   }
   dialog.Redraw(true);
+  Send();
   EXPECT_EQ(ScreenColors(6, 10), std::make_pair(kBlack, kWhite));
   EXPECT_EQ(ScreenColors(7, 13), std::make_pair(kDarkGrey, kWhite));
   EXPECT_EQ(ScreenColors(13, 13), std::make_pair(kYellow, kDarkGrey));
@@ -101,11 +126,14 @@ TEST_F(WindowTest, MonochromeDimsWithStandoutAndShowsTheBodyPlain) {
   monochrome = true;
   Dialog dialog(nullptr, 60, 13, 6);
   dialog.Redraw(true);
+  Send();
   EXPECT_TRUE(CellAt(curscr, 7, 13).standout);    // header on dark grey
   EXPECT_FALSE(CellAt(curscr, 13, 11).standout);  // body on yellow
   dialog.Redraw(false);
+  Send();
   EXPECT_TRUE(CellAt(curscr, 13, 11).standout);
   dialog.Redraw(true);
+  Send();
   EXPECT_FALSE(CellAt(curscr, 13, 11).standout);
   EXPECT_FALSE(CellAt(curscr, 13, 13).standout);
 }
@@ -119,6 +147,7 @@ TEST_F(WindowTest, TopLevelWindowKeepsTheCursorWhileDimmed) {
   dialog.Redraw(false);
   EXPECT_FALSE(Window::CursorVisible());
   dialog.Redraw(true);
+  Send();
   EXPECT_TRUE(Window::CursorVisible());
   EXPECT_EQ(getcury(curscr), 6 + 6 + 2);
   EXPECT_EQ(getcurx(curscr), 10 + 5);
@@ -143,6 +172,7 @@ TEST_F(WindowTest, RootWindowLaysOutItsPanesAndShowsTheVersionLine) {
   EXPECT_EQ(menu.Description().Height(), 18);
 
   menu.Show();
+  Send();
   EXPECT_EQ(LineAt(0, 0), "\u250c");
   EXPECT_EQ(ScreenColors(0, 0), std::make_pair(kLightGrey, kWhite));
   EXPECT_EQ(LineAt(2, 1), "\u2500");  // the line on row 2
