@@ -10,6 +10,7 @@
 #include "platform/api/HostMgrException.h"
 #include "platform/api/HykCtlExec.h"
 #include "runtime/HostPath.h"
+#include "runtime/ScreenFlush.h"
 #include "runtime/SystemLog.h"
 
 namespace Tulk {
@@ -22,6 +23,7 @@ constexpr bool kUseShell = false;
 
 void RunServicesScript(const char* verb) {
   const std::string line = HostPath("/bin/sh") + " " + HostPath("/sbin/services.sh") + " " + verb;
+  FlushBeforeCommand();  // the step it announces is on the screen first
   try {
     HykCtl::Util::HykCtl_Exec(line, kCaptureOutput, kWaitForExit, kUseShell);
   } catch (const HostMgr::Lib::HostMgrException& error) {

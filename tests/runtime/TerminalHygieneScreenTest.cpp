@@ -53,9 +53,9 @@ TEST(TerminalHygiene, EscDelayFromTheEnvironmentIsHonoured) {
   options.env["ESCDELAY"] = "10000";
   TestConsole console(options);
   ASSERT_TRUE(console.WaitForText("KEYECHO active"));
-  console.Send("\x1b");
-  std::this_thread::sleep_for(300ms);
-  console.Send("OB");
+  console.SendNow("\x1b");
+  std::this_thread::sleep_for(300ms);  // the line's gap, not a wait for the console
+  console.SendNow("OB");
   ASSERT_TRUE(console.WaitForText("keys: 1", 15s));
   EXPECT_TRUE(console.Contains("last key: KEY_DOWN")) << console.Dump();
 }
