@@ -1,11 +1,11 @@
 #include "ProcessHygiene.h"
 
+#include <fcntl.h>
 #include <signal.h>
+#include <unistd.h>
 
 #include <algorithm>
 #include <filesystem>
-#include <fstream>
-#include <iterator>
 #include <sstream>
 
 namespace TulkTest {
@@ -16,9 +16,25 @@ namespace fs = std::filesystem;
 constexpr char kPamFolderParent[] = "/tmp";
 constexpr char kPamFolderPrefix[] = "pam.";
 
+// The file's bytes, or as many as could be read: a /proc file of a process
+// that ends meanwhile fails its read (ESRCH), which the stream library would
+// turn into an exception.
 std::string ReadAll(const fs::path& path) {
-  std::ifstream in(path);
-  return std::string(std::istreambuf_iterator<char>(in), {});
+  std::string text;
+  const int fd = open(path.c_str(), O_RDONLY | O_CLOEXEC);
+  if (fd < 0) {
+    return text;
+  }
+  char buffer[4096];
+  for (;;) {
+    const ssize_t got = read(fd, buffer, sizeof buffer);
+    if (got <= 0) {
+      break;
+    }
+    text.append(buffer, static_cast<std::size_t>(got));
+  }
+  close(fd);
+  return text;
 }
 
 // The session id of a process from /proc/<pid>/stat, or -1.
