@@ -1,11 +1,10 @@
 // Whole-binary measurements of the real tulk in a pseudo-terminal at 80x25:
-// start-up to a settled screen, how soon a key (and a lone Esc) is answered, peak memory (in the menu with the demo's
-// PAM set-up), the cost of idling and of a repaint (xterm-256color), and
-// the bytes of the first screen, a typed character, login to menu, a Down
-// in the menu and a key that ends the dimmed state, each against the
-// fewest bytes that make the same change (ScreenCost.h), on xterm-256color
-// and vt102. Output: one line per figure, "name  median  min  max  unit",
-// stable for scripts.
+// start-up to a settled screen, how soon a key (and a lone Esc) is answered, peak memory (in the
+// menu with the demo's PAM set-up), the cost of idling and of a repaint (xterm-256color), and the
+// bytes of the first screen, a typed character, login to menu, a Down in the menu and a key that
+// ends the dimmed state, each against the fewest bytes that make the same change (ScreenCost.h), on
+// xterm-256color and vt102. Output: one line per figure, "name  median  min  max  unit", stable for
+// scripts.
 //
 //   tulk-console-bench [--runs N] [--byte-runs N] [--idle-seconds S]
 //                      [--only bytes|process] [--tulk PATH]

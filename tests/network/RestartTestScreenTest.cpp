@@ -244,8 +244,7 @@ TEST(SystemCustomizationScreenTest, TheThreeNetworkEntriesOpenTheirScreens) {
     ASSERT_TRUE(DriverTest::Gone(console, c.shown));
     // Back in the menu, shown again from its first entry.
     EXPECT_TRUE(WaitUntil(
-        console, [&] { return DriverTest::RightTitle(console) == "Configure Password"; },
-        c.entry));
+        console, [&] { return DriverTest::RightTitle(console) == "Configure Password"; }, c.entry));
   }
 }
 

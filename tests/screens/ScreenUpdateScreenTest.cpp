@@ -96,8 +96,7 @@ TEST(ScreenUpdateScreenTest, KeyThatEndsTheDimmedStateSendsTheScreenOnce) {
   // that came before the dimming).
   const auto awake = console.ReadyAt();
   ASSERT_TRUE(WaitUntil(
-      console,
-      [&] { return console.At(row, 40).bg == Tulk::kBlack && console.ReadyAt() > awake; },
+      console, [&] { return console.At(row, 40).bg == Tulk::kBlack && console.ReadyAt() > awake; },
       "the dimmed screen"));
   const std::size_t before = console.Output().size();
   console.Type("x");
