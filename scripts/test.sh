@@ -7,12 +7,16 @@
 #      systemd in a Debian 12 container: ten Ctrl-C, the sandbox's
 #      operations (scripts/check-container.sh; as root only);
 #   2. sanitizer build (AddressSanitizer + UndefinedBehaviorSanitizer): the
-#      same tests again;
+#      same tests again, then the reliability suite on it, one test at a
+#      time (random keys on every screen, sizes and signals, kill -9 during
+#      state writes, hostile host values; scripts/reliability.sh runs it
+#      longer);
 #   3. a short libFuzzer run of every fuzz target (60 s each when CI=true,
 #      10 s otherwise; TULK_FUZZ_SECONDS overrides).
 # Each test run gets a private TMPDIR and fails when it leaves a pam_wrapper
 # folder (/tmp/pam.X, few and shared by the machine) or a process behind.
-# Options: --no-asan and --no-fuzz skip steps 2 and 3, --no-tidy the
+# Options: --no-asan and --no-fuzz skip steps 2 and 3, --no-reliability
+# the reliability suite, --no-tidy the
 # clang-tidy part of step 1, --no-container the container check (for quick
 # local runs).
 set -euo pipefail
@@ -21,6 +25,7 @@ cd "$(dirname "$0")/.."
 run_asan=1
 run_fuzz=1
 run_container=1
+run_reliability=1
 check_options=()
 for argument in "$@"; do
   case "$argument" in
@@ -28,7 +33,8 @@ for argument in "$@"; do
     --no-fuzz) run_fuzz=0 ;;
     --no-tidy) check_options=(--no-tidy) ;;
     --no-container) run_container=0 ;;
-    *) echo "usage: scripts/test.sh [--no-asan] [--no-fuzz] [--no-tidy] [--no-container]" >&2; exit 2 ;;
+    --no-reliability) run_reliability=0 ;;
+    *) echo "usage: scripts/test.sh [--no-asan] [--no-fuzz] [--no-tidy] [--no-container] [--no-reliability]" >&2; exit 2 ;;
   esac
 done
 
@@ -91,6 +97,11 @@ if ((run_asan)); then
   scripts/build.sh asan
   ASAN_OPTIONS=detect_leaks=1:abort_on_error=1 UBSAN_OPTIONS=print_stacktrace=1:halt_on_error=1 \
     run_ctest --preset asan -j "$jobs"
+  if ((run_reliability)); then
+    echo "== reliability suite (sanitizer build, one test at a time)"
+    ASAN_OPTIONS=detect_leaks=1:abort_on_error=1 UBSAN_OPTIONS=print_stacktrace=1:halt_on_error=1 \
+      run_ctest --preset reliability-asan
+  fi
 fi
 
 if ((run_fuzz)) && [[ -x scripts/run-fuzzers.sh ]]; then

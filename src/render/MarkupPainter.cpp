@@ -6,6 +6,7 @@
 
 #include "include/ColorNumbers.h"
 #include "render/MarkupTag.h"
+#include "render/TerminalText.h"
 #include "runtime/Palette.h"
 
 namespace Tulk {
@@ -56,6 +57,9 @@ class Painter {
   void Flush() {
     if (pending_.empty()) {
       return;
+    }
+    if (!IsTerminalSafe(pending_)) {
+      pending_ = TerminalSafe(pending_);
     }
     int length = static_cast<int>(std::min<std::size_t>(pending_.size(), 1 << 20));
     int fits = std::min(length, width_ - column_);

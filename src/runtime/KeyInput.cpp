@@ -49,7 +49,7 @@ bool InputAtEnd() {
 
 // A poll() that keeps failing must not turn the key loop into a busy loop.
 void PauseAfterPollFailure() {
-  timespec pause{0, 100 * 1000 * 1000};
+  timespec pause{0, 100L * 1000 * 1000};
   nanosleep(&pause, nullptr);
 }
 

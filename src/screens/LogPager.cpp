@@ -28,12 +28,16 @@ namespace {
 constexpr char kPager[] = "/bin/less";
 constexpr char kPrompt[] = "<Q> Quit </> RegExp Search <H> Help";
 
+// The console's environment without PATH (when confined) and without the
+// pager's own variables but LESSSECURE; then LESSHISTFILE=- and
+// LESSCHARSET=ascii.
 std::vector<std::string> ChildEnvironment() {
   std::vector<std::string> entries;
   for (char** entry = environ; *entry != nullptr; ++entry) {
     const bool path = std::strncmp(*entry, "PATH=", 5) == 0;
-    const bool history = std::strncmp(*entry, "LESSHISTFILE=", 13) == 0;
-    if (!history && !(path && HostRootConfined())) {
+    const bool pagers = std::strncmp(*entry, "LESS", 4) == 0 &&
+                        std::strncmp(*entry, kLessSecure, std::strlen(kLessSecure)) != 0;
+    if (!pagers && !(path && HostRootConfined())) {
       entries.emplace_back(*entry);
     }
   }
@@ -41,14 +45,18 @@ std::vector<std::string> ChildEnvironment() {
     entries.push_back("PATH=" + ProgramSearchPath());
   }
   entries.push_back(std::string(kLessHistoryFile) + "=-");
+  entries.push_back(std::string(kLessCharacterSet) + "=ascii");
   return entries;
 }
 
-// The attributes saved at start-up, with the suspend key off.
+// The attributes saved at start-up, with the suspend key and flow control
+// off: as in the console itself, Ctrl-S must not freeze the screen (the
+// pager would block on its output and stop reading keys).
 void GiveStartupAttributes() {
   if (const auto& startup = SavedTerminalAttributes(); startup) {
     termios attributes = *startup;
     attributes.c_cc[VSUSP] = _POSIX_VDISABLE;
+    attributes.c_iflag &= ~static_cast<tcflag_t>(IXON | IXOFF);
     tcsetattr(STDOUT_FILENO, TCSANOW, &attributes);
   }
 }
@@ -60,10 +68,17 @@ void TakeTerminalBack(const termios* consoleAttributes) {
   keypad(stdscr, FALSE);
   keypad(stdscr, TRUE);
   if (enter_ca_mode != nullptr) {
-    // putp() writes through standard output's buffer: flushed now, the
-    // sequence cannot reach the terminal after curses has left the
-    // alternate screen at exit.
-    putp(enter_ca_mode);
+    // Some terminals keep the cursor's visibility with the state saved on
+    // entering the alternate screen and bring it back on leaving it: the
+    // cursor is shown first, as it was when curses entered it at start-up,
+    // so that the console's exit does not leave it hidden. putp() writes
+    // through standard output's buffer: flushed now, the sequences cannot
+    // reach the terminal after curses has left the alternate screen at
+    // exit.
+    if (cursor_normal != nullptr) {
+      (void)putp(cursor_normal);
+    }
+    (void)putp(enter_ca_mode);
     std::fflush(stdout);
   }
   const bool visible = Window::CursorVisible();
@@ -91,6 +106,11 @@ void ShowLogInPager(RuntimeFrame* screen, const std::string& path) {
   termios consoleAttributes{};
   const bool haveAttributes = tcgetattr(STDOUT_FILENO, &consoleAttributes) == 0;
   GiveStartupAttributes();
+  // The pager gets the terminal as a program started from a shell would:
+  // cursor shown. A pager ended by a signal cannot restore what it saved
+  // on entering the alternate screen, and the console's exit then leaves
+  // the terminal with the cursor as it stood when the pager started.
+  curs_set(1);
   clear();
   refresh();
   RuntimeFrame* current = currentWindow;

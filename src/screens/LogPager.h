@@ -9,6 +9,16 @@
 /// with LESSHISTFILE=- (no history file is written, in the operator's home
 /// or anywhere else).
 ///
+/// Decisions of this implementation: the pager gets none of the pager
+/// variables of the console's environment but LESSSECURE (LESS=-R would let
+/// a log's escape sequences reach the terminal, LESSOPEN would run a
+/// preprocessor on the file), and it shows the file as ASCII
+/// (LESSCHARSET=ascii): control characters as "^X", ESC as "ESC" and every
+/// other byte outside ASCII as "<XX>". Host logs are ASCII; a log line
+/// holding bidirectional-text controls (U+202E and the like), which the
+/// pager would pass through to the terminal in a UTF-8 character set,
+/// cannot then reorder what the operator reads.
+///
 /// Only a regular file (or one that does not exist: the pager then says
 /// so) is shown. Anything else in a log's place (a FIFO, a device such as
 /// /dev/zero or /dev/tty) would hang the pager, and with it the console:
@@ -17,7 +27,9 @@
 ///
 /// While it runs the console's screen is suspended: the terminal has the
 /// attributes saved at start-up (runtime/Terminal.h) with the suspend key
-/// switched off (the console has no shell to return to), the pager is in
+/// switched off (the console has no shell to return to) and flow control
+/// off (Ctrl-S would otherwise freeze the pager's output, and the pager with
+/// it, until Ctrl-Q), the pager is in
 /// front of the console (runtime/ForegroundProgram.h) and no window is
 /// current. Afterwards, whatever the pager's exit status (or when it could
 /// not be started at all), LESSSECURE is set back (an unset variable comes
@@ -44,6 +56,8 @@ class RuntimeFrame;
 inline constexpr char kLessSecure[] = "LESSSECURE";
 /// The environment variable that names the pager's history file.
 inline constexpr char kLessHistoryFile[] = "LESSHISTFILE";
+/// The environment variable that names the pager's character set.
+inline constexpr char kLessCharacterSet[] = "LESSCHARSET";
 
 /// Shows the host file `path` (such as "/var/log/syslog.log") in the pager
 /// and repaints `screen` (the current window) when it ends. Throws

@@ -1,8 +1,10 @@
 #include "toolkit/Window.h"
 
 #include <algorithm>
+#include <string>
 
 #include "include/ColorNumbers.h"
+#include "render/TerminalText.h"
 #include "runtime/Palette.h"
 #include "runtime/ScreenFlush.h"
 
@@ -209,6 +211,11 @@ void Window::RedrawLines() {
 void Window::WriteClipped(WINDOW* window, int column, int row, std::string_view text) {
   if (window == nullptr || wmove(window, row, column) == ERR) {
     return;
+  }
+  std::string safe;
+  if (!IsTerminalSafe(text)) {
+    safe = TerminalSafe(text);
+    text = safe;
   }
   int room = getmaxx(window) - column;
   int length = static_cast<int>(std::min<std::size_t>(text.size(), static_cast<std::size_t>(room)));

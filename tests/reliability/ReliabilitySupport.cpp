@@ -1,0 +1,176 @@
+#include "ReliabilitySupport.h"
+
+#include <fcntl.h>
+#include <termios.h>
+#include <unistd.h>
+
+#include <algorithm>
+#include <array>
+#include <chrono>
+#include <cstdio>
+#include <cstdlib>
+#include <cstring>
+#include <fstream>
+
+#include "KeyNames.h"
+#include "ScreenTestSupport.h"
+
+namespace Reliability {
+
+TulkTest::Options ConsoleOptions(const nlohmann::json& host) {
+  TulkTest::Options options;
+  options.hostState = host.dump();
+  options.pamUsers = {{"root", kRootPassword}};
+  options.prepareRoot = [](const std::filesystem::path& root) {
+    TulkTest::WriteRootFile(root, "/var/run/brimlo/show-tulk-login");
+  };
+  return options;
+}
+
+::testing::AssertionResult LogIn(TulkTest::TestConsole& console) {
+  if (auto welcome = TulkTest::Settled(console, kWelcomeText); !welcome) {
+    return welcome;
+  }
+  console.Key("F2");
+  if (auto shown = TulkTest::Settled(console, "Authentication Required"); !shown) {
+    return shown;
+  }
+  // On a local console the dialog starts on the keyboard label above the
+  // login name.
+  console.Key("Down", console.Contains("Configured Keyboard") ? 2 : 1);
+  console.Type(kRootPassword);
+  console.Key("Enter");
+  return TulkTest::Settled(console, "System Customization");
+}
+
+std::string RightTitle(const TulkTest::TestConsole& console) {
+  std::string text;
+  for (int col = 42; col < 79; ++col) {
+    text += console.At(1, col).text;
+  }
+  return text.substr(0, text.find_last_not_of(' ') + 1);
+}
+
+::testing::AssertionResult SelectEntry(TulkTest::TestConsole& console, const std::string& title) {
+  for (int step = 0; step < 30; ++step) {
+    if (RightTitle(console) == title) {
+      return ::testing::AssertionSuccess();
+    }
+    console.Key("Down");
+    if (auto ready = console.WaitReady(); !ready) {
+      return ready;
+    }
+  }
+  return ::testing::AssertionFailure() << "no menu entry \"" << title << "\"\n" << console.Dump();
+}
+
+::testing::AssertionResult OpenEntry(TulkTest::TestConsole& console, const std::string& title) {
+  if (auto selected = SelectEntry(console, title); !selected) {
+    return selected;
+  }
+  console.Key("Enter");
+  return ::testing::AssertionSuccess();
+}
+
+std::vector<std::string> EntryTitles(TulkTest::TestConsole& console) {
+  std::vector<std::string> titles;
+  for (int step = 0; step < 30; ++step) {
+    std::string title = RightTitle(console);
+    if (std::find(titles.begin(), titles.end(), title) != titles.end()) {
+      break;  // the last entry: Down no longer moves, or wrapped round
+    }
+    titles.push_back(title);
+    console.Key("Down");
+    if (!console.WaitReady()) {
+      break;
+    }
+  }
+  console.Key("Home");
+  (void)console.WaitReady();
+  return titles;
+}
+
+long ResidentKiB(pid_t pid) {
+  const std::string path = "/proc/" + std::to_string(pid) + "/status";
+  const int fd = open(path.c_str(), O_RDONLY | O_CLOEXEC);
+  if (fd < 0) {
+    return 0;
+  }
+  std::array<char, 4096> buffer{};
+  const ssize_t count = read(fd, buffer.data(), buffer.size() - 1);
+  close(fd);
+  if (count <= 0) {
+    return 0;
+  }
+  const char* line = std::strstr(buffer.data(), "VmRSS:");
+  return line == nullptr ? 0 : std::strtol(line + 6, nullptr, 10);
+}
+
+::testing::AssertionResult TerminalGivenBack(const TulkTest::TestConsole& console,
+                                             const std::string& shownText) {
+  std::optional<termios> attributes = console.TerminalAttributes();
+  if (!attributes) {
+    return ::testing::AssertionFailure() << "the terminal's attributes cannot be read";
+  }
+  if ((attributes->c_lflag & (ICANON | ECHO)) != (ICANON | ECHO)) {
+    return ::testing::AssertionFailure() << "line editing or echo left off";
+  }
+  if ((attributes->c_iflag & IXON) == 0) {
+    return ::testing::AssertionFailure() << "flow control left off";
+  }
+  if (!console.Cursor().visible) {
+    return ::testing::AssertionFailure() << "the cursor was left hidden\n" << console.Dump();
+  }
+  if (!shownText.empty() && console.Contains(shownText)) {
+    return ::testing::AssertionFailure() << "the console's screen was left up\n" << console.Dump();
+  }
+  return ::testing::AssertionSuccess();
+}
+
+std::uint32_t Seed() {
+  static const std::uint32_t seed = [] {
+    if (const char* text = std::getenv("TULK_RELIABILITY_SEED"); text != nullptr && *text != 0) {
+      return static_cast<std::uint32_t>(std::strtoul(text, nullptr, 10));
+    }
+    return static_cast<std::uint32_t>(std::chrono::steady_clock::now().time_since_epoch().count());
+  }();
+  return seed;
+}
+
+int Scale() {
+  const char* text = std::getenv("TULK_RELIABILITY_SCALE");
+  const int scale = text == nullptr ? 1 : std::atoi(text);
+  return scale < 1 ? 1 : scale;
+}
+
+std::string KeyStream::Burst(int most) {
+  static const std::array<const char*, 27> kNames = {
+      "F1",     "F2",       "F3",     "F4",     "F5",    "F6",    "F7",   "F8",        "F9",
+      "F10",    "F11",      "F12",    "Up",     "Down",  "Right", "Left", "Home",      "End",
+      "PageUp", "PageDown", "Insert", "Delete", "Enter", "Esc",   "Tab",  "Backspace", "Space"};
+  std::uniform_int_distribution<int> count(1, most);
+  std::uniform_int_distribution<int> kind(0, 3);
+  std::uniform_int_distribution<int> byte(0, 255);
+  std::uniform_int_distribution<std::size_t> name(0, kNames.size() - 1);
+  std::string burst;
+  for (int n = count(engine_); n > 0; --n) {
+    if (kind(engine_) == 0) {
+      burst += TulkTest::KeyBytes(kNames[name(engine_)]);
+      continue;
+    }
+    int value = byte(engine_);
+    while (value == 0x03 || value == 0x1a || value == 0x1c) {
+      value = byte(engine_);
+    }
+    burst += static_cast<char>(value);
+  }
+  return burst;
+}
+
+void Figure(const std::string& name, const std::string& value) {
+  std::printf("[ figures  ] %s: %s\n", name.c_str(), value.c_str());
+  std::fflush(stdout);
+  ::testing::Test::RecordProperty(name, value);
+}
+
+}  // namespace Reliability
