@@ -1,17 +1,17 @@
-// "View System Logs": the numbered list, the digit that picks a log, and
-// the hand-over of the terminal to the real pager and back.
+// "View System Logs": the numbered list and the digit that picks a log
+// (the hand-over to the real pager and back: PagerScreenTest).
 
 #include <gtest/gtest.h>
 #include <sys/stat.h>
 
 #include <filesystem>
 
-#include "MenuTestSupport.h"
+#include "ScreenTestSupport.h"
 
 namespace {
 
-using MenuTest::DriverOptions;
-using MenuTest::SelectEntry;
+using TulkTest::DriverOptions;
+using TulkTest::SelectEntry;
 using TulkTest::TestConsole;
 
 const char* const kLogs[] = {"syslog.log", "hykernel.log", "sysboot.log", "mgmtd.log",
@@ -42,7 +42,7 @@ std::string PagerRunFor(TestConsole& console, char digit) {
   std::filesystem::remove(record);
   console.Type(std::string(1, digit));
   EXPECT_TRUE(console.WaitReady());
-  const std::string line = MenuTest::ReadText(record);
+  const std::string line = TulkTest::ReadText(record);
   if (line.empty()) {
     return "";
   }
@@ -62,7 +62,7 @@ TEST(LogScreenTest, ThreeLogsAreNumberedAndDigitsKeepTheirQuirks) {
   EXPECT_EQ(PagerRunFor(console, '2'), "hykernel.log");
   EXPECT_EQ(PagerRunFor(console, '5'), "mgmtd.log");
   EXPECT_EQ(PagerRunFor(console, '0'), "mgmtd.log");
-  ASSERT_TRUE(MenuTest::Settled(console, "<3> Config"));
+  ASSERT_TRUE(TulkTest::Settled(console, "<3> Config"));
   console.Key("Down");
   EXPECT_EQ(PagerRunFor(console, '1'), "");
 }
@@ -76,34 +76,6 @@ TEST(LogScreenTest, AllSevenLogsPresentIgnoreEightNineAndZero) {
     EXPECT_EQ(PagerRunFor(console, digit), "") << digit;
   }
   EXPECT_EQ(PagerRunFor(console, '7'), "qobd.log");
-}
-
-TEST(LogScreenTest, PagerRefusesShellCommandsAndTheMenuComesBack) {
-  TulkTest::Options options = DriverOptions();
-  options.prepareRoot = [](const std::filesystem::path& root) {
-    TulkTest::WriteRootFile(root, "/var/log/syslog.log", "first line of the host log\n");
-  };
-  TestConsole console(options);
-  ASSERT_TRUE(SelectEntry(console, "View System Logs"));
-  const termios menuAttributes = *console.TerminalAttributes();
-  console.Type("1");
-  // The pager has the terminal now: the console reports nothing until it
-  // is back, so these waits are for text.
-  ASSERT_TRUE(console.WaitForText("first line of the host log"));
-  EXPECT_TRUE(console.WaitForText("<Q> Quit </> RegExp Search <H> Help"));
-  EXPECT_FALSE(console.Contains("System Customization"));
-  console.Type("!");
-  EXPECT_TRUE(console.WaitForText("Command not available"));
-  console.Type("q");
-  ASSERT_TRUE(MenuTest::Settled(console, "System Customization"));
-  EXPECT_TRUE(console.WaitForText("<1> Syslog"));
-  EXPECT_FALSE(console.Contains("first line of the host log"));
-  const termios restored = *console.TerminalAttributes();
-  EXPECT_EQ(restored.c_lflag, menuAttributes.c_lflag);
-  EXPECT_EQ(restored.c_iflag, menuAttributes.c_iflag);
-  console.Key("Down");
-  ASSERT_TRUE(console.WaitReady());
-  EXPECT_EQ(MenuTest::RightTitle(console), "View Support Information") << console.Dump();
 }
 
 }  // namespace

@@ -10,19 +10,19 @@
 #include <regex>
 #include <sstream>
 
-#include "SessionTestSupport.h"
+#include "ScreenTestSupport.h"
 
 namespace {
 
 using nlohmann::json;
-using SessionTest::ConsoleOptions;
-using SessionTest::CountLog;
-using SessionTest::Gone;
-using SessionTest::RecordsWhere;
-using SessionTest::RowOf;
-using SessionTest::Settled;
-using SessionTest::WaitUntil;
+using TulkTest::ConsoleOptions;
+using TulkTest::CountLog;
+using TulkTest::Gone;
+using TulkTest::RecordsWhere;
+using TulkTest::RowOf;
+using TulkTest::Settled;
 using TulkTest::TestConsole;
+using TulkTest::WaitUntil;
 namespace fs = std::filesystem;
 using namespace std::chrono_literals;
 
@@ -67,7 +67,7 @@ std::string CommonStack(const std::string& type, const fs::path& folder) {
 // "nobody" stands for an ordinary user: pam_faillock counts only users the
 // machine's user database knows.
 std::unique_ptr<TestConsole> ShippedServiceConsole(bool lockout) {
-  SessionTest::PamSetup pam;
+  TulkTest::PamSetup pam;
   pam.users = {{"root", kRightPassword}, {"nobody", kRightPassword}};
   TulkTest::Options options = ConsoleOptions(TulkTest::DemoHostState(), pam);
   options.start = false;
@@ -103,7 +103,9 @@ std::unique_ptr<TestConsole> ShippedServiceConsole(bool lockout) {
   return Gone(console, kInvalid);
 }
 
-TEST(PamServiceScreenTest, FailedLoginIsDelayedAndTheRightPasswordLogsIn) {
+// A failed login is delayed, the right password then logs in, and a
+// password change goes through the common password stack.
+TEST(PamServiceScreenTest, FailedLoginIsDelayedThenLoginAndPasswordChange) {
   std::unique_ptr<TestConsole> console = ShippedServiceConsole(false);
   ASSERT_TRUE(Settled(*console, "Customize System/View Logs"));
   console->Key("F2");
@@ -124,12 +126,7 @@ TEST(PamServiceScreenTest, FailedLoginIsDelayedAndTheRightPasswordLogsIn) {
   console->Key("Enter");
   ASSERT_TRUE(Settled(*console, "System Customization"));
   EXPECT_EQ(CountLog(*console, "<32>Authentication of user root succeeded"), 1);
-}
 
-TEST(PamServiceScreenTest, PasswordChangeGoesThroughTheCommonPasswordStack) {
-  std::unique_ptr<TestConsole> console = ShippedServiceConsole(false);
-  ASSERT_TRUE(SessionTest::LogIn(*console, "root", kRightPassword));
-  ASSERT_TRUE(Settled(*console, "System Customization"));
   console->Key("Enter");  // Configure Password
   ASSERT_TRUE(Settled(*console, "Old Password:"));
   console->Type(kRightPassword);
@@ -160,7 +157,7 @@ class LockoutTest : public ::testing::TestWithParam<Lockout> {};
 TEST_P(LockoutTest, ThreeFailuresLockOrdinaryUsersOnly) {
   const Lockout& c = GetParam();
   std::unique_ptr<TestConsole> console = ShippedServiceConsole(true);
-  ASSERT_TRUE(SessionTest::LogIn(*console, c.user, "wrong"));
+  ASSERT_TRUE(TulkTest::LogIn(*console, c.user, "wrong"));
   ASSERT_TRUE(Failed(*console, c.user, 1));
   for (int attempt = 2; attempt <= 3; ++attempt) {
     console->Type("wrong");

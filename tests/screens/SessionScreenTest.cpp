@@ -4,20 +4,22 @@
 #include <signal.h>
 
 #include "ProcessHygiene.h"
-#include "SessionTestSupport.h"
+#include "ScreenTestSupport.h"
 
 namespace {
 
 using nlohmann::json;
-using SessionTest::ConsoleOptions;
-using SessionTest::CountLog;
-using SessionTest::Gone;
-using SessionTest::LogIn;
-using SessionTest::RecordsWhere;
-using SessionTest::Settled;
+using TulkTest::ConsoleOptions;
+using TulkTest::CountLog;
+using TulkTest::Gone;
+using TulkTest::LogIn;
+using TulkTest::RecordsWhere;
+using TulkTest::Settled;
 using TulkTest::TestConsole;
 
-TEST(SessionScreenTest, EscFromTheMenuLogsOut) {
+// Esc from the menu logs out; a SIGUSR2 during a later session exits after
+// its logout.
+TEST(SessionScreenTest, EscFromTheMenuLogsOutAndSigusr2ExitsAfterLogout) {
   TestConsole console(ConsoleOptions());
   ASSERT_TRUE(LogIn(console));
   ASSERT_TRUE(Settled(console, "System Customization"));
@@ -36,6 +38,18 @@ TEST(SessionScreenTest, EscFromTheMenuLogsOut) {
   ASSERT_TRUE(Settled(console, "System Customization"));
   console.Key("Esc");
   ASSERT_TRUE(console.WaitForLog("User operator logged out"));
+
+  ASSERT_TRUE(LogIn(console));
+  ASSERT_TRUE(Settled(console, "System Customization"));
+  console.Signal(SIGUSR2);
+  console.Key("Down");
+  ASSERT_TRUE(console.WaitReady());
+  EXPECT_TRUE(console.Running());
+  EXPECT_TRUE(console.Contains("System Customization"));
+  console.Key("Esc");
+  EXPECT_EQ(console.WaitExit(), 0);
+  EXPECT_EQ(CountLog(console, "<14>User root logged out"), 2);
+  EXPECT_EQ(RecordsWhere(console, "audit.jsonl", "event", "tulk.logout").size(), 3u);
 }
 
 TEST(SessionScreenTest, IdleTimeoutEndsTheSession) {
@@ -61,25 +75,6 @@ TEST(SessionScreenTest, IdleTimeoutEndsTheSession) {
   console.Key("F2");
   ASSERT_TRUE(Settled(console, "Authentication Required"));
 }
-
-TEST(SessionScreenTest, Sigusr2DuringASessionExitsAfterLogout) {
-  TestConsole console(ConsoleOptions());
-  ASSERT_TRUE(LogIn(console));
-  ASSERT_TRUE(Settled(console, "System Customization"));
-  console.Signal(SIGUSR2);
-  console.Key("Down");
-  ASSERT_TRUE(console.WaitReady());
-  EXPECT_TRUE(console.Running());
-  EXPECT_TRUE(console.Contains("System Customization"));
-  console.Key("Esc");
-  EXPECT_EQ(console.WaitExit(), 0);
-  EXPECT_EQ(CountLog(console, "<14>User root logged out"), 1);
-  EXPECT_EQ(RecordsWhere(console, "audit.jsonl", "event", "tulk.logout").size(), 1u);
-}
-
-}  // namespace
-
-namespace {
 
 TEST(SessionScreenTest, KilledConsoleLeavesNoPamFolderBehind) {
   std::string marker;

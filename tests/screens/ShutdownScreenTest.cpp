@@ -3,25 +3,22 @@
 
 #include <algorithm>
 
-#include "SessionTestSupport.h"
+#include "ScreenTestSupport.h"
 
 namespace {
 
 using nlohmann::json;
-using SessionTest::CommandLines;
-using SessionTest::ConsoleOptions;
-using SessionTest::CountLog;
-using SessionTest::Gone;
-using SessionTest::LogIn;
-using SessionTest::RecordsWhere;
-using SessionTest::Settled;
-using SessionTest::WaitUntil;
+using TulkTest::CommandLines;
+using TulkTest::ConsoleOptions;
+using TulkTest::CountLog;
+using TulkTest::Gone;
+using TulkTest::LogIn;
+using TulkTest::RecordsWhere;
+using TulkTest::Settled;
 using TulkTest::TestConsole;
+using TulkTest::WaitUntil;
 
-bool Ran(const TestConsole& console, const std::string& line) {
-  const std::vector<std::string> commands = CommandLines(console);
-  return std::find(commands.begin(), commands.end(), line) != commands.end();
-}
+using TulkTest::Ran;
 
 int CountRuns(const TestConsole& console, const std::string& name) {
   const std::vector<std::string> commands = CommandLines(console);
@@ -31,7 +28,7 @@ int CountRuns(const TestConsole& console, const std::string& name) {
 }
 
 ::testing::AssertionResult OpenShutdown(TestConsole& console) {
-  if (auto login = LogIn(console, "root", SessionTest::kRootPassword, "F12"); !login) {
+  if (auto login = LogIn(console, "root", TulkTest::kRootPassword, "F12"); !login) {
     return login;
   }
   return Settled(console, "[ ] Forcefully terminate running VMs, if any ...");
@@ -41,7 +38,9 @@ std::string Power(const TestConsole& console) {
   return TulkTest::ReadHostState(console.HostStatePath()).value("power", "");
 }
 
-TEST(ShutdownScreenTest, EscLeavesWithoutRunningAnything) {
+// Esc leaves without running anything; a shutdown then keeps the machines
+// graceful.
+TEST(ShutdownScreenTest, EscLeavesThenShutDownKeepsMachinesGraceful) {
   TestConsole console(ConsoleOptions());
   ASSERT_TRUE(OpenShutdown(console));
   EXPECT_TRUE(console.Contains("Remote management software is recommended to safely"));
@@ -57,10 +56,7 @@ TEST(ShutdownScreenTest, EscLeavesWithoutRunningAnything) {
   EXPECT_EQ(Power(console), "on");
   // Shutting down is not a session: no logout is recorded.
   EXPECT_TRUE(RecordsWhere(console, "audit.jsonl", "event", "tulk.logout").empty());
-}
 
-TEST(ShutdownScreenTest, ShutDownKeepsMachinesGracefulUnlessTicked) {
-  TestConsole console(ConsoleOptions());
   ASSERT_TRUE(OpenShutdown(console));
   console.Key("F2");
   ASSERT_TRUE(Settled(console, "Shutdown in progress..."));

@@ -9,7 +9,7 @@
 
 namespace {
 
-using namespace TroubleshootingTest;
+using namespace TulkTest;
 
 constexpr char kQuestion[] = "Restart management agents now?";
 constexpr char kCapture[] = "Collecting host agent live core information. Done.";
@@ -24,7 +24,7 @@ TEST(RestartAgentsScreenTest, OnlyF11RestartsAndOnlyEnterCloses) {
   ASSERT_TRUE(Settled(console, "[X] Collect extra troubleshooting information"));
   console.Key("Esc");
   ASSERT_TRUE(console.WaitForText("result: 0"));
-  EXPECT_EQ(ToolRuns(console), Lines{});
+  EXPECT_EQ(CommandLines(console), Lines{});
   EXPECT_EQ(LogLinesWith(console, "agents"), Lines{});
 
   console.Type("o");
@@ -34,7 +34,7 @@ TEST(RestartAgentsScreenTest, OnlyF11RestartsAndOnlyEnterCloses) {
   EXPECT_EQ(ForegroundOf(console, "Stopping management agents. Done."), 6);  // dark grey
   EXPECT_TRUE(console.Contains("Starting management agents. Done."));
   EXPECT_FALSE(console.Contains("Collecting"));
-  EXPECT_EQ(ToolRuns(console), (Lines{"services.sh stop", "services.sh start"}));
+  EXPECT_EQ(CommandLines(console), (Lines{"services.sh stop", "services.sh start"}));
   EXPECT_EQ(LogLinesWith(console, "agents"), Lines{"Restarting host agents"});
   const auto events = TulkTest::SimRecords(console.Root(), "events.jsonl");
   ASSERT_EQ(events.size(), 1U);
@@ -43,7 +43,7 @@ TEST(RestartAgentsScreenTest, OnlyF11RestartsAndOnlyEnterCloses) {
   console.Key("F11");
   console.Key("Enter");
   EXPECT_TRUE(console.WaitForText("result: 1"));
-  EXPECT_EQ(ToolRuns(console).size(), 2U);
+  EXPECT_EQ(CommandLines(console).size(), 2U);
 }
 
 TEST(RestartAgentsScreenTest, CaptureIsDoneBeforeTheStopAndMayOutliveTheDialog) {
@@ -69,7 +69,7 @@ TEST(RestartAgentsScreenTest, CaptureIsDoneBeforeTheStopAndMayOutliveTheDialog) 
     cores += entry.path().filename().string().rfind("mgmtd-restart", 0) == 0 ? 1 : 0;
   }
   EXPECT_EQ(cores, 1);
-  EXPECT_EQ(ToolRuns(console, "hykbacktrace").back(),
+  EXPECT_EQ(CommandLines(console, "hykbacktrace").back(),
             "hykbacktrace -w -n mgmtd -o mgmtd-restart% -d /var/log/");
   console.Type("o");  // the console still answers
   EXPECT_TRUE(console.WaitForText(kQuestion));
