@@ -11,13 +11,7 @@
 
 namespace {
 
-using TulkTest::CloseDialog;
-using TulkTest::Gone;
-using TulkTest::OpenDialog;
-using TulkTest::OpenWindow;
-using TulkTest::RightPane;
-using TulkTest::Settled;
-using TulkTest::TestConsole;
+using namespace TulkTest;
 
 // The pane rows that start with an adapter's name, in order.
 std::vector<std::string> AdapterRows(TestConsole& console) {
@@ -32,8 +26,7 @@ std::vector<std::string> AdapterRows(TestConsole& console) {
 }
 
 ::testing::AssertionResult PaneShows(TestConsole& console, const std::string& row) {
-  return TulkTest::WaitUntil(
-      console,
+  return console.WaitUntil(
       [&] {
         const std::vector<std::string> rows = RightPane(console);
         return std::find(rows.begin(), rows.end(), row) != rows.end();
@@ -63,7 +56,7 @@ std::vector<std::string> AdapterRows(TestConsole& console) {
 }
 
 TEST(NetworkDialogScreenTest, AdaptersKeepTheMarkingOrderAndVlanIdsAreChecked) {
-  TestConsole console(TulkTest::ConsoleOptions());
+  TestConsole console(ConsoleOptions());
   ASSERT_TRUE(OpenWindow(console));
   {
     ASSERT_TRUE(OpenDialog(console, "Network Adapters", "Select the adapters"));
@@ -140,17 +133,16 @@ TEST(NetworkDialogScreenTest, AdaptersKeepTheMarkingOrderAndVlanIdsAreChecked) {
 }
 
 TEST(NetworkDialogScreenTest, DnsIpv4AndIpv6FormsCheckTheirInputsAndKeepTheirModes) {
-  TestConsole console(TulkTest::ConsoleOptions());
+  TestConsole console(ConsoleOptions());
   ASSERT_TRUE(OpenWindow(console));
   {
     const char* kForm = "Use the following DNS";
     ASSERT_TRUE(OpenDialog(console, "DNS Configuration", kForm));
     console.Key("Down", 3);
     console.Type("2001:db8::53");
-    EXPECT_TRUE(TulkTest::WaitUntil(
-        console,
+    EXPECT_TRUE(console.WaitUntil(
         [&] {
-          const int row = TulkTest::RowOf(console, "[ 2001:db8::53");
+          const int row = RowOf(console, "[ 2001:db8::53");
           return row >= 0 && console.Row(row).find("IPv6 DNS Server") != std::string::npos;
         },
         "the second server labelled as IPv6"));

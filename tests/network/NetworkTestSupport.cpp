@@ -10,9 +10,8 @@ namespace TulkTest {
   if (auto window = Settled(console, "Custom DNS Suffixes"); !window) {
     return window;
   }
-  return WaitUntil(
-      console, [&] { return RightTitle(console) != "Configure Management Network"; },
-      "the window's first entry");
+  return console.WaitUntil([&] { return RightTitle(console) != "Configure Management Network"; },
+                           "the window's first entry");
 }
 
 ::testing::AssertionResult OpenDialog(TestConsole& console, const std::string& label,

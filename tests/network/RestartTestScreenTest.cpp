@@ -13,14 +13,7 @@
 
 namespace {
 
-using TulkTest::CommandLines;
-using TulkTest::DemoHostState;
-using TulkTest::DriverOptions;
-using TulkTest::Events;
-using TulkTest::HostState;
-using TulkTest::Settled;
-using TulkTest::TestConsole;
-using TulkTest::WaitUntil;
+using namespace TulkTest;
 using Json = nlohmann::json;
 using namespace std::chrono_literals;
 
@@ -30,10 +23,9 @@ bool Has(const std::vector<std::string>& lines, const std::string& line) {
 
 // Waits until the report line holding `line` ends with its verdict.
 ::testing::AssertionResult WaitForVerdict(TestConsole& console, const std::string& line) {
-  return WaitUntil(
-      console,
+  return console.WaitUntil(
       [&] {
-        const int row = TulkTest::RowOf(console, line);
+        const int row = RowOf(console, line);
         return row >= 0 && (console.Row(row).find("OK.") != std::string::npos ||
                             console.Row(row).find("Failed.") != std::string::npos);
       },
@@ -83,8 +75,8 @@ TEST(RestartNetworkScreenTest, OnlyF11RestartsAndTheReportListsTheAddresses) {
   for (const Case& c : cases) {
     SCOPED_TRACE(c.what);
     if (restarts > 0) {
-      ASSERT_TRUE(TulkTest::Gone(console, "Restart Management Network"));
-      TulkTest::ReplaceHostState(console, hostOf(c));
+      ASSERT_TRUE(Gone(console, "Restart Management Network"));
+      ReplaceHostState(console, hostOf(c));
       console.Type("o");
     }
     ASSERT_TRUE(Settled(console, "Restart management network now?"));
@@ -92,15 +84,15 @@ TEST(RestartNetworkScreenTest, OnlyF11RestartsAndTheReportListsTheAddresses) {
     console.Key("Enter");
     console.Key("Space");
     ASSERT_TRUE(console.WaitReady());
-    EXPECT_EQ(TulkTest::CountLog(console, "<14>Restarting hyk0"), restarts);
+    EXPECT_EQ(CountLog(console, "<14>Restarting hyk0"), restarts);
     EXPECT_TRUE(console.Contains("Restart management network now?"));
 
     console.Key("F11");
     ASSERT_TRUE(console.WaitForText("<Enter> OK"));
     ++restarts;
-    EXPECT_TRUE(WaitUntil(
-        console, [&] { return TulkTest::CountLog(console, "<14>Restarting hyk0") == restarts; },
-        "the restart's log line"));
+    EXPECT_TRUE(
+        console.WaitUntil([&] { return CountLog(console, "<14>Restarting hyk0") == restarts; },
+                          "the restart's log line"));
     const std::vector<Json> events = Events(console, "qob.user.tulk.network.restart");
     ASSERT_EQ(events.size(), static_cast<std::size_t>(restarts));
     EXPECT_EQ(events.back()["text"], "Restarting hyk0");
@@ -136,20 +128,20 @@ TEST(TestNetworkScreenTest, DefaultsFromTheHostAndSkippedInputsKeepTheirNumbers)
   console.Key("Enter");
   ASSERT_TRUE(WaitForVerdict(console, "Resolving hostname (tavi-01.lab.example.net)."));
   EXPECT_FALSE(console.Contains("#1"));
-  const int linkLocal = TulkTest::RowOf(console, "Pinging address #2 (fe80::1%hyk0).");
+  const int linkLocal = RowOf(console, "Pinging address #2 (fe80::1%hyk0).");
   ASSERT_GE(linkLocal, 0) << console.Dump();
   EXPECT_NE(console.Row(linkLocal).find("OK."), std::string::npos);
-  const int unreachable = TulkTest::RowOf(console, "Pinging address #3 (10.20.30.99).");
+  const int unreachable = RowOf(console, "Pinging address #3 (10.20.30.99).");
   ASSERT_GE(unreachable, 0) << console.Dump();
   EXPECT_NE(console.Row(unreachable).find("Failed."), std::string::npos);
-  const int resolved = TulkTest::RowOf(console, "Resolving hostname (tavi-01.lab.example.net).");
+  const int resolved = RowOf(console, "Resolving hostname (tavi-01.lab.example.net).");
   ASSERT_GE(resolved, 0) << console.Dump();
   EXPECT_NE(console.Row(resolved).find("OK."), std::string::npos);
 
   const std::vector<std::string> commands = CommandLines(console);
   EXPECT_TRUE(Has(commands, "hykping -c 3 -I hyk0 fe80::1%hyk0"));
   EXPECT_TRUE(Has(commands, "hykping -c 3 -I hyk0 10.20.30.99"));
-  EXPECT_EQ(TulkTest::ReadText(console.Root() / "etc/hosts"), TulkTest::kHostsFile);
+  EXPECT_EQ(ReadText(console.Root() / "etc/hosts"), kHostsFile);
   EXPECT_FALSE(std::filesystem::exists(console.Root() / "etc/hosts.backup"));
   console.Key("Esc");
   console.Key("Enter");
@@ -163,21 +155,21 @@ TEST(TestNetworkScreenTest, EscDuringAPingEndsTheTestAtOnce) {
   ASSERT_TRUE(Settled(console, "Resolve Hostname"));
   console.Key("Enter");
   ASSERT_TRUE(console.WaitForText("Pinging address #1 (10.20.30.1)."));
-  ASSERT_TRUE(WaitUntil(
-      console, [&] { return Has(CommandLines(console), "hykping -c 3 -I hyk0 10.20.30.1"); },
+  ASSERT_TRUE(console.WaitUntil(
+      [&] { return Has(CommandLines(console), "hykping -c 3 -I hyk0 10.20.30.1"); },
       "the ping to start"));
   console.Key("Esc");
   // The form's result: it was confirmed; the test itself was cut short.
   ASSERT_TRUE(console.WaitForText("result: 1"));
   EXPECT_FALSE(console.Contains("Resolving hostname"));
   // The ping is still waiting: the dialog did not wait for it.
-  for (const Json& record : TulkTest::SimRecords(console.Root(), "commands.jsonl")) {
+  for (const Json& record : SimRecords(console.Root(), "commands.jsonl")) {
     EXPECT_TRUE(record["exitCode"].is_null()) << record.dump();
   }
   // The abandoned ping ends by itself (and leaves nothing running).
-  EXPECT_TRUE(WaitUntil(
-      console, [&] { return TulkTest::SimRecords(console.Root(), "commands.jsonl").size() == 2; },
-      "the abandoned ping to end", 15s));
+  EXPECT_TRUE(
+      console.WaitUntil([&] { return SimRecords(console.Root(), "commands.jsonl").size() == 2; },
+                        "the abandoned ping to end", 15s));
 }
 
 TEST(TestNetworkScreenTest, WithoutAManagementInterfaceThePingNamesNoInterface) {
@@ -199,30 +191,29 @@ TEST(TestNetworkScreenTest, KilledDuringTheNameCheckTheNextStartRestoresTheHosts
   first.Key("Enter");
   ASSERT_TRUE(first.WaitForText("Resolving hostname", 10s));
   const std::filesystem::path backup = first.Root() / "etc/hosts.backup";
-  ASSERT_TRUE(WaitUntil(
-      first,
+  ASSERT_TRUE(first.WaitUntil(
       [&] {
         return std::filesystem::exists(backup) &&
-               TulkTest::ReadText(first.Root() / "etc/hosts").find("tavi-01") == std::string::npos;
+               ReadText(first.Root() / "etc/hosts").find("tavi-01") == std::string::npos;
       },
       "the hosts file to be edited"));
   first.Signal(SIGKILL);
   ASSERT_TRUE(first.WaitExit());
-  const std::string edited = TulkTest::ReadText(first.Root() / "etc/hosts");
-  const std::string saved = TulkTest::ReadText(backup);
-  EXPECT_EQ(saved, TulkTest::kHostsFile);
+  const std::string edited = ReadText(first.Root() / "etc/hosts");
+  const std::string saved = ReadText(backup);
+  EXPECT_EQ(saved, kHostsFile);
 
   // The real console starts on a root in that state.
   TulkTest::Options options;
   options.hostState = DemoHostState().dump();
   options.prepareRoot = [&](const std::filesystem::path& root) {
-    TulkTest::WriteRootFile(root, "/etc/hosts", edited);
-    TulkTest::WriteRootFile(root, "/etc/hosts.backup", saved);
+    WriteRootFile(root, "/etc/hosts", edited);
+    WriteRootFile(root, "/etc/hosts.backup", saved);
   };
   TestConsole next(options);
   EXPECT_TRUE(next.WaitForLog(
       "<12>Restored /etc/hosts from /etc/hosts.backup left by an interrupted network test"));
-  EXPECT_EQ(TulkTest::ReadText(next.Root() / "etc/hosts"), TulkTest::kHostsFile);
+  EXPECT_EQ(ReadText(next.Root() / "etc/hosts"), kHostsFile);
   EXPECT_FALSE(std::filesystem::exists(next.Root() / "etc/hosts.backup"));
 }
 

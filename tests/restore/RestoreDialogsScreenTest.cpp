@@ -9,12 +9,7 @@
 
 namespace {
 
-using TulkTest::DriverOptions;
-using TulkTest::Gone;
-using TulkTest::HostState;
-using TulkTest::SelectEntry;
-using TulkTest::Settled;
-using TulkTest::TestConsole;
+using namespace TulkTest;
 using Json = nlohmann::json;
 
 const Json* Find(const Json& list, const std::string& name) {

@@ -13,16 +13,7 @@
 
 namespace {
 
-using TulkTest::CommandLines;
-using TulkTest::DriverOptions;
-using TulkTest::Events;
-using TulkTest::HostState;
-using TulkTest::RightFooter;
-using TulkTest::RightTitle;
-using TulkTest::RowOf;
-using TulkTest::SelectEntry;
-using TulkTest::Settled;
-using TulkTest::TestConsole;
+using namespace TulkTest;
 using Json = nlohmann::json;
 using namespace std::chrono_literals;
 
@@ -81,8 +72,8 @@ TEST(RestoreMenuScreenTest, EntriesAreGreyedByTheirConditions) {
     SCOPED_TRACE(c.what);
     if (!std::exchange(first, false)) {
       console.Key("Esc");
-      ASSERT_TRUE(TulkTest::Gone(console, "Restore DVS"));
-      TulkTest::ReplaceHostState(console, c.host());
+      ASSERT_TRUE(Gone(console, "Restore DVS"));
+      ReplaceHostState(console, c.host());
       console.Type("o");
     }
     ASSERT_TRUE(Settled(console, "Restore DVS"));
@@ -104,7 +95,7 @@ TEST(RestoreMenuScreenTest, RightHalfFollowsTheSelection) {
   EXPECT_TRUE(console.WaitForLog("<14>zyo-opsagent version >= 3 detected"));
   EXPECT_EQ(RightTitle(console), "Create Standard Switch");
   // The generic footer until the first move.
-  EXPECT_EQ(TulkTest::Squeezed(RightFooter(console)), "<Enter> Change <Esc> Exit");
+  EXPECT_EQ(Squeezed(RightFooter(console)), "<Enter> Change <Esc> Exit");
   struct Step {
     const char* title;
     const char* footer;
@@ -127,15 +118,13 @@ TEST(RestoreMenuScreenTest, RightHalfFollowsTheSelection) {
   };
   for (const Step& step : steps) {
     ASSERT_TRUE(SelectEntry(console, step.title));
-    EXPECT_TRUE(TulkTest::WaitUntil(
-        console, [&] { return TulkTest::Squeezed(RightFooter(console)) == step.footer; },
-        step.footer));
-    EXPECT_TRUE(TulkTest::WaitUntil(
-        console,
-        [&] { return TulkTest::RightText(console).find(step.description) != std::string::npos; },
+    EXPECT_TRUE(console.WaitUntil([&] { return Squeezed(RightFooter(console)) == step.footer; },
+                                  step.footer));
+    EXPECT_TRUE(console.WaitUntil(
+        [&] { return RightText(console).find(step.description) != std::string::npos; },
         step.description));
   }
-  EXPECT_EQ(TulkTest::RightText(console).find("BrimLo DVS."), std::string::npos);
+  EXPECT_EQ(RightText(console).find("BrimLo DVS."), std::string::npos);
   console.Key("Esc");
   EXPECT_TRUE(console.WaitForText("result: 1"));
 }
@@ -183,7 +172,7 @@ TEST(FactoryRestoreScreenTest, EscAtTheVmWarningThenTheNetworkIsRebuilt) {
   console.Key("Esc");
   console.Key("Enter");
   ASSERT_TRUE(console.WaitUntil(
-      [&] { return TulkTest::CountLog(console, "<14>Restoring factory network settings") == 2; },
+      [&] { return CountLog(console, "<14>Restoring factory network settings") == 2; },
       "the second restore logged"));
   EXPECT_TRUE(Settled(console, "Restore Network Settings"));
 }
@@ -221,18 +210,18 @@ TEST(SafeModeScreenTest, ManagementMovesToTheNextFreeSwitchAndTheEntryTurnsGrey)
   console.Key("F11");
   ASSERT_TRUE(console.WaitForLog(
       "<14>Enabling safe mode networking by moving all uplinks to a new management vSwitch"));
-  ASSERT_TRUE(TulkTest::WaitUntil(
-      console, [&] { return RightTitle(console) == "Restore DVS"; }, "the cursor on Restore DVS"));
-  EXPECT_TRUE(TulkTest::WaitUntil(
-      console, [&] { return Greyed(console, "Restore Standard Switch"); }, "entry 69 greyed"));
+  ASSERT_TRUE(console.WaitUntil([&] { return RightTitle(console) == "Restore DVS"; },
+                                "the cursor on Restore DVS"));
+  EXPECT_TRUE(console.WaitUntil([&] { return Greyed(console, "Restore Standard Switch"); },
+                                "entry 69 greyed"));
   const Json network = HostState(console)["network"];
   EXPECT_EQ(
       network["hykernelNics"][0]["connection"],
       Json({{"type", "portgroup"}, {"switch", "vSwitch2"}, {"portGroup", "Management Network2"}}));
   // Up passes over the grey entry.
   console.Key("Up");
-  EXPECT_TRUE(TulkTest::WaitUntil(
-      console, [&] { return RightTitle(console) == "Restore Network Settings"; }, "Up"));
+  EXPECT_TRUE(
+      console.WaitUntil([&] { return RightTitle(console) == "Restore Network Settings"; }, "Up"));
 }
 
 }  // namespace

@@ -10,9 +10,7 @@
 
 namespace {
 
-using TulkTest::DriverOptions;
-using TulkTest::SelectEntry;
-using TulkTest::TestConsole;
+using namespace TulkTest;
 
 const char* const kLogs[] = {"syslog.log", "hykernel.log", "sysboot.log", "mgmtd.log",
                              "hlma.log",   "hagt.log",     "qobd.log"};
@@ -22,13 +20,12 @@ TulkTest::Options RecordingPager(int logsPresent) {
   TulkTest::Options options = DriverOptions();
   options.prepareRoot = [logsPresent](const std::filesystem::path& root) {
     for (int i = 0; i < logsPresent; ++i) {
-      TulkTest::WriteRootFile(root, std::string("/var/log/") + kLogs[i], "log\n");
+      WriteRootFile(root, std::string("/var/log/") + kLogs[i], "log\n");
     }
     const std::filesystem::path pager = root / "bin/less";
     std::filesystem::remove(pager);
-    TulkTest::WriteRootFile(
-        root, "/bin/less",
-        "#!/bin/sh\necho \"$LESSSECURE|$*\" >> " + (root / "pager.txt").string() + "\n");
+    WriteRootFile(root, "/bin/less",
+                  "#!/bin/sh\necho \"$LESSSECURE|$*\" >> " + (root / "pager.txt").string() + "\n");
     chmod(pager.c_str(), 0755);
   };
   return options;
@@ -42,7 +39,7 @@ std::string PagerRunFor(TestConsole& console, char digit) {
   std::filesystem::remove(record);
   console.Type(std::string(1, digit));
   EXPECT_TRUE(console.WaitReady());
-  const std::string line = TulkTest::ReadText(record);
+  const std::string line = ReadText(record);
   if (line.empty()) {
     return "";
   }
@@ -62,7 +59,7 @@ TEST(LogScreenTest, ThreeLogsAreNumberedAndDigitsKeepTheirQuirks) {
   EXPECT_EQ(PagerRunFor(console, '2'), "hykernel.log");
   EXPECT_EQ(PagerRunFor(console, '5'), "mgmtd.log");
   EXPECT_EQ(PagerRunFor(console, '0'), "mgmtd.log");
-  ASSERT_TRUE(TulkTest::Settled(console, "<3> Config"));
+  ASSERT_TRUE(Settled(console, "<3> Config"));
   console.Key("Down");
   EXPECT_EQ(PagerRunFor(console, '1'), "");
 }

@@ -10,15 +10,8 @@
 
 namespace {
 
+using namespace TulkTest;
 using nlohmann::json;
-using TulkTest::ConsoleOptions;
-using TulkTest::DemoHostState;
-using TulkTest::Gone;
-using TulkTest::LogIn;
-using TulkTest::RecordsWhere;
-using TulkTest::RowOf;
-using TulkTest::Settled;
-using TulkTest::TestConsole;
 
 // The name and password mode, Esc leaving no trace, typing that sends only
 // the changed cells, and F3 switching to the PIN mode and back.
@@ -88,13 +81,13 @@ class FailedLoginTest : public ::testing::TestWithParam<FailedLogin> {};
 
 TEST_P(FailedLoginTest, IsLoggedAuditedPostedAndShown) {
   const FailedLogin& c = GetParam();
-  TulkTest::PamSetup pam;
+  PamSetup pam;
   pam.policy = {c.policy};
   TestConsole console(ConsoleOptions(DemoHostState(), pam));
   ASSERT_TRUE(LogIn(console, c.user, c.password));
   ASSERT_TRUE(Settled(console, c.message));
   EXPECT_TRUE(console.Contains("Authentication failed"));
-  EXPECT_EQ(TulkTest::CountLog(console, std::string("<35>") + c.logLine), 1);
+  EXPECT_EQ(CountLog(console, std::string("<35>") + c.logLine), 1);
   const auto audit = RecordsWhere(console, "audit.jsonl", "event", "tulk.login");
   ASSERT_EQ(audit.size(), 1u);
   EXPECT_EQ(audit[0]["result"], "failure");
@@ -137,11 +130,11 @@ TEST(LoginScreenTest, FailedLoginKeepsTheNameAndCanBeRetried) {
   ASSERT_TRUE(Gone(console, "Invalid login or password."));
   EXPECT_TRUE(console.Contains("Login Name:        [ root "));
   EXPECT_FALSE(console.Contains("*****"));
-  console.Type(TulkTest::kRootPassword);
+  console.Type(kRootPassword);
   console.Key("Enter");
   ASSERT_TRUE(Settled(console, "System Customization"));
-  EXPECT_EQ(TulkTest::CountLog(console, "<32>Authentication of user root succeeded"), 1);
-  EXPECT_EQ(TulkTest::CountLog(console, "<14>User root logged in"), 1);
+  EXPECT_EQ(CountLog(console, "<32>Authentication of user root succeeded"), 1);
+  EXPECT_EQ(CountLog(console, "<14>User root logged in"), 1);
   const auto logins = RecordsWhere(console, "audit.jsonl", "event", "tulk.login");
   ASSERT_EQ(logins.size(), 2u);
   EXPECT_EQ(logins[1]["result"], "success");
@@ -149,16 +142,16 @@ TEST(LoginScreenTest, FailedLoginKeepsTheNameAndCanBeRetried) {
 }
 
 TEST(LoginScreenTest, ExpiredPasswordIsChangedThenLoginAgain) {
-  TulkTest::PamSetup pam;
+  PamSetup pam;
   pam.policy = {"root:expired"};
   TestConsole console(ConsoleOptions(DemoHostState(), pam));
   ASSERT_TRUE(LogIn(console));
   ASSERT_TRUE(Settled(console, "Password has expired."));
   console.Key("Enter");
   ASSERT_TRUE(Settled(console, "Setting the password will prevent unauthorized access"));
-  console.Type(TulkTest::kRootPassword);
+  console.Type(kRootPassword);
   console.Key("Down");
-  ASSERT_TRUE(TulkTest::CursorOn(console, "New Password:"));
+  ASSERT_TRUE(CursorOn(console, "New Password:"));
   console.Type("fresh-1");
   console.Key("Down");
   console.Type("fresh-1");
@@ -166,7 +159,7 @@ TEST(LoginScreenTest, ExpiredPasswordIsChangedThenLoginAgain) {
   ASSERT_TRUE(Gone(console, "Confirm Password:"));
   ASSERT_TRUE(Settled(console, "Authentication Required"));
   EXPECT_FALSE(console.Contains("System Customization"));
-  EXPECT_NE(TulkTest::ReadText(console.PamPasswordFile()).find("root:fresh-1:"), std::string::npos);
+  EXPECT_NE(ReadText(console.PamPasswordFile()).find("root:fresh-1:"), std::string::npos);
 
   console.Type("fresh-1");
   console.Key("Enter");
@@ -175,7 +168,7 @@ TEST(LoginScreenTest, ExpiredPasswordIsChangedThenLoginAgain) {
 }
 
 TEST(LoginScreenTest, EmptyPasswordMarksThePasswordNotSet) {
-  TulkTest::PamSetup pam;
+  PamSetup pam;
   pam.users = {{"root", ""}};
   TestConsole console(ConsoleOptions(DemoHostState(), pam));
   ASSERT_TRUE(LogIn(console, "root", ""));
@@ -186,14 +179,14 @@ TEST(LoginScreenTest, EmptyPasswordMarksThePasswordNotSet) {
 TEST(LoginScreenTest, SmartCardLoginAndRemoval) {
   json host = DemoHostState();
   host["smartCards"] = json::array({{{"userId", "cardholder"}, {"valid", true}}});
-  TulkTest::PamSetup pam;
+  PamSetup pam;
   pam.users["cardholder"] = "2468";
   TestConsole console(ConsoleOptions(host, pam));
   ASSERT_TRUE(Settled(console, "Customize System/View Logs"));
   console.Key("F2");
   ASSERT_TRUE(Settled(console, "Enter the smart card login PIN for"));
   EXPECT_TRUE(console.Contains("Login Id:          [ cardholder "));
-  EXPECT_EQ(TulkTest::CountLog(console, "<14>Found smart card with user id 'cardholder'"), 1);
+  EXPECT_EQ(CountLog(console, "<14>Found smart card with user id 'cardholder'"), 1);
   console.Key("Down");
   console.Type("2468");
   console.Key("Enter");
@@ -204,7 +197,7 @@ TEST(LoginScreenTest, SmartCardLoginAndRemoval) {
   ASSERT_TRUE(Settled(console, "Old Password:"));
 
   host["smartCards"][0]["valid"] = false;
-  TulkTest::ReplaceHostState(console, host);
+  ReplaceHostState(console, host);
   console.Signal(SIGUSR1);
   ASSERT_TRUE(console.WaitForLog("Logging out user id 'cardholder'"));
   EXPECT_EQ(console.WaitExit(), 0);
@@ -221,7 +214,7 @@ TEST(LoginScreenTest, KeyboardLabelAndCursorOnALocalConsole) {
   EXPECT_EQ(RowOf(console, "Login Name:"), label + 1);
   EXPECT_EQ(RowOf(console, "Password:"), label + 2);
   console.Key("Tab");
-  ASSERT_TRUE(TulkTest::CursorOn(console, "Login Name:"));
+  ASSERT_TRUE(CursorOn(console, "Login Name:"));
   console.Key("Up");
   console.Key("Enter");
   ASSERT_TRUE(Settled(console, "Configure Keyboard"));
@@ -237,26 +230,26 @@ TEST(LoginScreenTest, KeyboardLabelAndCursorOnALocalConsole) {
   ASSERT_TRUE(Settled(console, "Configured Keyboard (US Default)"));
   int column = -1;
   for (int col = 0; col < 70 && column < 0; ++col) {
-    if (TulkTest::Cells(console, label, col, 10) == "Configured") {
+    if (Cells(console, label, col, 10) == "Configured") {
       column = col;
     }
   }
   ASSERT_GE(column, 0);
   const auto onLabel = [&] {
-    const TulkTest::CursorState cursor = console.Cursor();
+    const CursorState cursor = console.Cursor();
     return cursor.visible && cursor.row == label && cursor.col == column;
   };
-  EXPECT_TRUE(WaitUntil(console, onLabel, "the cursor on the label")) << console.Dump();
+  EXPECT_TRUE(console.WaitUntil(onLabel, "the cursor on the label")) << console.Dump();
   console.Key("Tab");
-  ASSERT_TRUE(WaitUntil(
-      console, [&] { return console.Cursor().row == label + 1; }, "the login name"));
+  ASSERT_TRUE(
+      console.WaitUntil([&] { return console.Cursor().row == label + 1; }, "the login name"));
   console.Key("Up");
-  EXPECT_TRUE(WaitUntil(console, onLabel, "the cursor back on the label")) << console.Dump();
+  EXPECT_TRUE(console.WaitUntil(onLabel, "the cursor back on the label")) << console.Dump();
   console.Key("Enter");
   ASSERT_TRUE(Settled(console, "Configure Keyboard"));
   console.Key("Esc");
   ASSERT_TRUE(Gone(console, "Configure Keyboard"));
-  EXPECT_TRUE(WaitUntil(console, onLabel, "the cursor on the label after the dialog"))
+  EXPECT_TRUE(console.WaitUntil(onLabel, "the cursor on the label after the dialog"))
       << console.Dump();
 }
 

@@ -14,17 +14,11 @@
 
 namespace {
 
-using TulkTest::DemoHostState;
-using TulkTest::DriverOptions;
-using TulkTest::RightTitle;
-using TulkTest::SelectEntry;
-using TulkTest::TestConsole;
+using namespace TulkTest;
 using Json = nlohmann::json;
 
 constexpr int kDarkGrey = 6;
 constexpr int kMenuTop = 4;  // screen row of the first entry
-
-using TulkTest::MenuRow;
 
 TEST(MenuScreenTest, HostStateGreysEntriesAndSelectionSkipsThem) {
   struct Case {
@@ -61,16 +55,16 @@ TEST(MenuScreenTest, HostStateGreysEntriesAndSelectionSkipsThem) {
   // One console: each case leaves the menu, replaces the host and opens
   // the menu again.
   TestConsole console(DriverOptions());
-  ASSERT_TRUE(TulkTest::Settled(console, "System Customization"));
+  ASSERT_TRUE(Settled(console, "System Customization"));
   for (const Case& c : cases) {
     SCOPED_TRACE(c.name);
     Json host = DemoHostState();
     c.change(host);
     console.Key("Esc");
-    ASSERT_TRUE(TulkTest::Gone(console, "System Customization"));
-    TulkTest::ReplaceHostState(console, host);
+    ASSERT_TRUE(Gone(console, "System Customization"));
+    ReplaceHostState(console, host);
     console.Type("o");
-    ASSERT_TRUE(TulkTest::Settled(console, "System Customization"));
+    ASSERT_TRUE(Settled(console, "System Customization"));
     for (const std::string& label : c.greyed) {
       const int row = MenuRow(console, label);
       ASSERT_GE(row, 0) << label << "\n" << console.Dump();
@@ -94,7 +88,7 @@ TEST(MenuScreenTest, EveryEntryDescribesItselfAndTheMenuRestartsAfterAScreen) {
   options.term = "xterm";
   options.env["TULK_DRIVER_EMPTY_PASSWORD"] = "1";
   TestConsole console(options);
-  ASSERT_TRUE(TulkTest::Settled(console, "System Customization"));
+  ASSERT_TRUE(Settled(console, "System Customization"));
   EXPECT_EQ(MenuRow(console, "Configure Keyboard"), kMenuTop + 8);
   EXPECT_EQ(MenuRow(console, "Troubleshooting Options"), kMenuTop + 9);
   struct Entry {
@@ -138,12 +132,11 @@ TEST(MenuScreenTest, EveryEntryDescribesItselfAndTheMenuRestartsAfterAScreen) {
   for (const auto& screen : screens) {
     ASSERT_TRUE(SelectEntry(console, screen.entry));
     console.Key("Enter");
-    ASSERT_TRUE(TulkTest::Settled(console, screen.dialogText));
+    ASSERT_TRUE(Settled(console, screen.dialogText));
     console.Key("Esc");
-    ASSERT_TRUE(TulkTest::Gone(console, screen.dialogText));
-    EXPECT_TRUE(TulkTest::WaitUntil(
-        console, [&] { return TulkTest::RightTitle(console) == "Configure Password"; },
-        "the first entry"))
+    ASSERT_TRUE(Gone(console, screen.dialogText));
+    EXPECT_TRUE(console.WaitUntil([&] { return RightTitle(console) == "Configure Password"; },
+                                  "the first entry"))
         << screen.entry;
   }
 }
@@ -154,11 +147,10 @@ TEST(MenuScreenTest, EveryEntryDescribesItselfAndTheMenuRestartsAfterAScreen) {
 TEST(MenuScreenTest, SupportPagesTurnWithinTheirLimits) {
   TulkTest::Options options = DriverOptions();
   options.prepareRoot = [](const std::filesystem::path& root) {
-    TulkTest::WriteRootFile(root, "/etc/brimlo/ssl/host.crt", "not a certificate\n");
-    TulkTest::WriteRootFile(
-        root, "/etc/brimlo/support",
-        "# not shown\nPage one of {hostname}\nsha256=[{ssl-thumbprint-sha-256}]\n"
-        "$\nPage two\n$\nPage three\n");
+    WriteRootFile(root, "/etc/brimlo/ssl/host.crt", "not a certificate\n");
+    WriteRootFile(root, "/etc/brimlo/support",
+                  "# not shown\nPage one of {hostname}\nsha256=[{ssl-thumbprint-sha-256}]\n"
+                  "$\nPage two\n$\nPage three\n");
   };
   TestConsole console(options);
   ASSERT_TRUE(SelectEntry(console, "View Support Information"));
@@ -167,17 +159,16 @@ TEST(MenuScreenTest, SupportPagesTurnWithinTheirLimits) {
   EXPECT_TRUE(console.WaitForLog("<11>Failed to generate the host's SHA256 SSL thumbprint"));
   EXPECT_FALSE(console.Contains("not shown"));
   console.Key("PageUp");
-  EXPECT_TRUE(TulkTest::Settled(console, "Page one"));
+  EXPECT_TRUE(Settled(console, "Page one"));
   console.Key("PageDown", 2);
-  EXPECT_TRUE(TulkTest::Settled(console, "Page three"));
+  EXPECT_TRUE(Settled(console, "Page three"));
   console.Key("PageDown");
-  EXPECT_TRUE(TulkTest::Settled(console, "Page three"));
+  EXPECT_TRUE(Settled(console, "Page three"));
   console.Key("Up");
   console.Key("Down");
-  EXPECT_TRUE(TulkTest::Settled(console, "Page one"));
+  EXPECT_TRUE(Settled(console, "Page one"));
   EXPECT_TRUE(console.Contains("sha256=[]"));
-  EXPECT_EQ(TulkTest::CountLog(console, "<11>Failed to generate the host's SHA256 SSL thumbprint"),
-            1);
+  EXPECT_EQ(CountLog(console, "<11>Failed to generate the host's SHA256 SSL thumbprint"), 1);
 }
 
 TEST(MenuScreenTest, SupportPageShowsHostFingerprints) {
@@ -186,20 +177,20 @@ TEST(MenuScreenTest, SupportPageShowsHostFingerprints) {
   options.prepareRoot = [](const std::filesystem::path& root) {
     const std::string ssl = (root / "etc/brimlo/ssl").string();
     const std::string ssh = (root / "etc/ssh").string();
-    TulkTest::Capture("openssl req -x509 -newkey rsa:2048 -nodes -subj /CN=tavi -days 2 -keyout " +
-                      ssl + "/host.key -out " + ssl + "/host.crt 2>/dev/null");
-    TulkTest::Capture("ssh-keygen -q -t ed25519 -N '' -f " + ssh + "/ssh_host_rsa_key");
-    TulkTest::WriteRootFile(root, "/etc/brimlo/support",
-                            "sha256=[{ssl-thumbprint-sha-256}]\nrsa=[{ssh-rsa-fingerprint}]\n"
-                            "dsa=[{ssh-dsa-fingerprint}]\n");
+    Capture("openssl req -x509 -newkey rsa:2048 -nodes -subj /CN=tavi -days 2 -keyout " + ssl +
+            "/host.key -out " + ssl + "/host.crt 2>/dev/null");
+    Capture("ssh-keygen -q -t ed25519 -N '' -f " + ssh + "/ssh_host_rsa_key");
+    WriteRootFile(root, "/etc/brimlo/support",
+                  "sha256=[{ssl-thumbprint-sha-256}]\nrsa=[{ssh-rsa-fingerprint}]\n"
+                  "dsa=[{ssh-dsa-fingerprint}]\n");
   };
   TestConsole console(options);
-  const std::string thumbprint = TulkTest::Capture(
-      "openssl x509 -noout -fingerprint -sha256 -in " +
-      (console.Root() / "etc/brimlo/ssl/host.crt").string() + " | cut -d= -f2 | tr -d '\\n'");
-  const std::string fingerprint = TulkTest::Capture(
-      "ssh-keygen -l -f " + (console.Root() / "etc/ssh/ssh_host_rsa_key").string() +
-      " | cut -d' ' -f2 | tr -d '\\n'");
+  const std::string thumbprint = Capture("openssl x509 -noout -fingerprint -sha256 -in " +
+                                         (console.Root() / "etc/brimlo/ssl/host.crt").string() +
+                                         " | cut -d= -f2 | tr -d '\\n'");
+  const std::string fingerprint =
+      Capture("ssh-keygen -l -f " + (console.Root() / "etc/ssh/ssh_host_rsa_key").string() +
+              " | cut -d' ' -f2 | tr -d '\\n'");
   ASSERT_EQ(thumbprint.size(), 95U);
   ASSERT_TRUE(SelectEntry(console, "View Support Information", 220));
   EXPECT_TRUE(console.WaitForText("sha256=[" + thumbprint + "]"));
@@ -216,7 +207,7 @@ TEST(MenuScreenTest, SupportPageShowsHostFingerprints) {
 // selection.
 TEST(MenuScreenTest, SlowLineMovesVanishedInterfaceAndReloadSignal) {
   TestConsole console(DriverOptions());
-  ASSERT_TRUE(TulkTest::Settled(console, "System Customization"));
+  ASSERT_TRUE(Settled(console, "System Customization"));
   EXPECT_EQ(MenuRow(console, "Configure Keyboard"), -1);
   EXPECT_EQ(MenuRow(console, "Troubleshooting Options"), kMenuTop + 8);
   for (int step = 0; step < 9; ++step) {  // to the last entry
@@ -229,15 +220,15 @@ TEST(MenuScreenTest, SlowLineMovesVanishedInterfaceAndReloadSignal) {
     EXPECT_LT(bytes, step == 0 ? 600U : 1000U) << from << " -> " << RightTitle(console);
   }
 
-  Json host = TulkTest::HostState(console);
+  Json host = HostState(console);
   host["network"].erase("managementInterface");
-  TulkTest::ReplaceHostState(console, host);
+  ReplaceHostState(console, host);
   ASSERT_TRUE(SelectEntry(console, "Restart Management Network"));
   console.Key("Enter");
   EXPECT_TRUE(console.WaitForText("Management network interface cannot be found."));
   EXPECT_TRUE(console.WaitForText("Restart Management Network: Error"));
   console.Key("Esc");
-  EXPECT_TRUE(TulkTest::Settled(console, "Management network interface cannot be found."));
+  EXPECT_TRUE(Settled(console, "Management network interface cannot be found."));
   console.Key("Enter");
   EXPECT_TRUE(console.WaitForTextGone("cannot be found"));
 
@@ -245,16 +236,16 @@ TEST(MenuScreenTest, SlowLineMovesVanishedInterfaceAndReloadSignal) {
   const int lockdownRow = MenuRow(console, "Configure Lockdown Mode");
   EXPECT_NE(console.At(lockdownRow, 3).fg, kDarkGrey);
   host["lockdown"]["possible"] = false;
-  TulkTest::ReplaceHostState(console, host);
+  ReplaceHostState(console, host);
   console.Signal(SIGUSR1);
-  EXPECT_TRUE(TulkTest::WaitUntil(
-      console, [&] { return console.At(lockdownRow, 3).fg == kDarkGrey; }, "greyed lockdown"));
+  EXPECT_TRUE(console.WaitUntil([&] { return console.At(lockdownRow, 3).fg == kDarkGrey; },
+                                "greyed lockdown"));
   ASSERT_TRUE(console.WaitReady());
   EXPECT_EQ(console.At(MenuRow(console, "Test Management Network"), 3).fg, kDarkGrey);
   EXPECT_EQ(RightTitle(console), "View System Logs");
   console.Key("Up");
-  EXPECT_TRUE(TulkTest::WaitUntil(
-      console, [&] { return RightTitle(console) == "Troubleshooting Options"; }, "a move"));
+  EXPECT_TRUE(console.WaitUntil([&] { return RightTitle(console) == "Troubleshooting Options"; },
+                                "a move"));
 }
 
 }  // namespace

@@ -14,20 +14,18 @@
 
 namespace {
 
+using namespace TulkTest;
 using namespace std::chrono_literals;
-using TulkTest::DriverOptions;
-using TulkTest::SelectEntry;
-using TulkTest::TestConsole;
 
 constexpr char kLogLine[] = "first line of the host log";
 
 // The menu driver on a root whose syslog holds kLogLine; `more` adds files.
 TulkTest::Options WithSyslog(
     const std::function<void(const std::filesystem::path&)>& more = nullptr,
-    const nlohmann::json& host = TulkTest::DemoHostState()) {
+    const nlohmann::json& host = DemoHostState()) {
   TulkTest::Options options = DriverOptions(host);
   options.prepareRoot = [more](const std::filesystem::path& root) {
-    TulkTest::WriteRootFile(root, "/var/log/syslog.log", std::string(kLogLine) + "\n");
+    WriteRootFile(root, "/var/log/syslog.log", std::string(kLogLine) + "\n");
     if (more) {
       more(root);
     }
@@ -49,7 +47,7 @@ TEST(PagerScreenTest, OnlyRegularFilesAreOffered) {
     std::filesystem::create_directories(root / "var/log");
     ASSERT_EQ(mkfifo((root / "var/log/hykernel.log").c_str(), 0644), 0);
     std::filesystem::create_symlink("/dev/zero", root / "var/log/sysboot.log");
-    TulkTest::WriteRootFile(root, "/var/log/mgmtd.log", "agent\n");
+    WriteRootFile(root, "/var/log/mgmtd.log", "agent\n");
   }));
   ASSERT_TRUE(SelectEntry(console, "View System Logs"));
   EXPECT_TRUE(console.WaitForText("<2> Management Agent (mgmtd)"));
@@ -62,9 +60,8 @@ TEST(PagerScreenTest, OnlyRegularFilesAreOffered) {
   console.Type("3");
   EXPECT_TRUE(console.WaitForLog("<12>Not showing /var/log/sysboot.log: not a regular file"));
   console.Key("Down");
-  EXPECT_TRUE(TulkTest::WaitUntil(
-      console, [&] { return TulkTest::RightTitle(console) == "View Support Information"; },
-      "the menu answering"));
+  EXPECT_TRUE(console.WaitUntil([&] { return RightTitle(console) == "View Support Information"; },
+                                "the menu answering"));
 }
 
 // In the pager: shell commands are refused, a search leaves no history
@@ -97,7 +94,7 @@ TEST(PagerScreenTest, PagerRefusesShellCommandsAndLeavesNoTraceBehind) {
   EXPECT_TRUE(console.WaitForText(kLogLine));
   console.Type("q");
 
-  ASSERT_TRUE(TulkTest::Settled(console, "System Customization"));
+  ASSERT_TRUE(Settled(console, "System Customization"));
   EXPECT_TRUE(console.WaitForText("<1> Syslog"));
   EXPECT_FALSE(console.Contains(kLogLine));
   const termios restored = *console.TerminalAttributes();
@@ -105,7 +102,7 @@ TEST(PagerScreenTest, PagerRefusesShellCommandsAndLeavesNoTraceBehind) {
   EXPECT_EQ(restored.c_iflag, menuAttributes.c_iflag);
   console.Key("Down");
   ASSERT_TRUE(console.WaitReady());
-  EXPECT_EQ(TulkTest::RightTitle(console), "View Support Information") << console.Dump();
+  EXPECT_EQ(RightTitle(console), "View Support Information") << console.Dump();
   const std::filesystem::path folder = console.Root().parent_path();
   EXPECT_FALSE(std::filesystem::exists(folder / ".lesshst"));
   EXPECT_FALSE(std::filesystem::exists(folder / "lesshst"));
@@ -141,7 +138,7 @@ TEST(PagerScreenTest, ResizeWhileThePagerRunsEndsTheConsoleAfterIt) {
 }
 
 TEST(PagerScreenTest, IdleTimeoutEndsThePagerAndTheSession) {
-  nlohmann::json host = TulkTest::DemoHostState();
+  nlohmann::json host = DemoHostState();
   host["advancedOptions"]["/UserVars/TulkTimeOut"] = 60;
   TulkTest::Options options = WithSyslog(nullptr, host);
   options.timeScale = 10;

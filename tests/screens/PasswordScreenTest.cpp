@@ -7,32 +7,24 @@
 
 namespace {
 
+using namespace TulkTest;
 using nlohmann::json;
-using TulkTest::ConsoleOptions;
-using TulkTest::CountLog;
-using TulkTest::CursorOn;
-using TulkTest::Gone;
-using TulkTest::LogIn;
-using TulkTest::RecordsWhere;
-using TulkTest::RowOf;
-using TulkTest::Settled;
-using TulkTest::TestConsole;
 
 constexpr char kDialogText[] = "Setting the password will prevent unauthorized access";
 
 std::string PasswordFile(const TestConsole& console) {
-  return TulkTest::ReadText(console.PamPasswordFile());
+  return ReadText(console.PamPasswordFile());
 }
 
 ::testing::AssertionResult OpenPasswordDialog(TestConsole& console) {
   if (auto login = LogIn(console); !login) {
     return login;
   }
-  if (auto menu = TulkTest::Settled(console, "System Customization"); !menu) {
+  if (auto menu = Settled(console, "System Customization"); !menu) {
     return menu;
   }
   console.Key("Enter");  // "Configure Password" is the first entry
-  return TulkTest::Settled(console, kDialogText);
+  return Settled(console, kDialogText);
 }
 
 std::vector<json> PasswordAudits(const TestConsole& console) {
@@ -43,7 +35,7 @@ std::vector<json> PasswordAudits(const TestConsole& console) {
 // and submits them.
 ::testing::AssertionResult SubmitPasswords(TestConsole& console, const std::string& next,
                                            const std::string& confirm) {
-  console.Type(TulkTest::kRootPassword);
+  console.Type(kRootPassword);
   console.Key("Down");
   if (auto moved = CursorOn(console, "New Password:"); !moved) {
     return moved;
@@ -104,12 +96,12 @@ TEST(PasswordScreenTest, RefusalsThenTheSamePasswordAfterAQuestion) {
 
   console.Key("Enter");
   ASSERT_TRUE(Settled(console, kDialogText));
-  console.Type(TulkTest::kRootPassword);
+  console.Type(kRootPassword);
   console.Key("Down");
   ASSERT_TRUE(CursorOn(console, "New Password:"));
-  console.Type(TulkTest::kRootPassword);
+  console.Type(kRootPassword);
   console.Key("Tab");
-  console.Type(TulkTest::kRootPassword);
+  console.Type(kRootPassword);
   console.Key("Enter");
   ASSERT_TRUE(Settled(console, "New password is same as old password. Are you sure?"));
   EXPECT_TRUE(console.Contains("<Enter> Confirm"));
@@ -128,8 +120,7 @@ TEST(PasswordScreenTest, RefusalsThenTheSamePasswordAfterAQuestion) {
   ASSERT_EQ(all.size(), 3u);
   EXPECT_EQ(all[2]["result"], "success");
   // The event follows the log line.
-  ASSERT_TRUE(TulkTest::WaitUntil(
-      console,
+  ASSERT_TRUE(console.WaitUntil(
       [&] {
         return !RecordsWhere(console, "events.jsonl", "id", "qob.user.tulk.login.passwd.changed")
                     .empty();
@@ -139,20 +130,20 @@ TEST(PasswordScreenTest, RefusalsThenTheSamePasswordAfterAQuestion) {
       RecordsWhere(console, "events.jsonl", "id", "qob.user.tulk.login.passwd.changed");
   ASSERT_EQ(events.size(), 1u);
   EXPECT_EQ(events[0]["text"], "Login password for user root changed");
-  const std::vector<std::string> commands = TulkTest::CommandLines(console);
+  const std::vector<std::string> commands = CommandLines(console);
   const auto backup = std::find(commands.begin(), commands.end(), "backup.sh 0");
   const auto refresh =
       std::find(commands.begin(), commands.end(), "osk-cmd -U root internalsvc/refresh");
   ASSERT_NE(backup, commands.end());
   ASSERT_NE(refresh, commands.end());
   EXPECT_LT(backup, refresh);
-  EXPECT_EQ(TulkTest::ReadHostState(console.HostStatePath())["users"]["configStoreSaves"], 1);
+  EXPECT_EQ(ReadHostState(console.HostStatePath())["users"]["configStoreSaves"], 1);
 }
 
 TEST(PasswordScreenTest, PamRefusingTheChangeIsReported) {
-  TulkTest::PamSetup pam;
+  PamSetup pam;
   pam.policy = {"root:chauthtok-fails"};
-  TestConsole console(ConsoleOptions(TulkTest::DemoHostState(), pam));
+  TestConsole console(ConsoleOptions(DemoHostState(), pam));
   ASSERT_TRUE(OpenPasswordDialog(console));
   ASSERT_TRUE(SubmitPasswords(console, "weak", "weak"));
   ASSERT_TRUE(Settled(console, "The password change operation failed."));
@@ -167,7 +158,7 @@ TEST(PasswordScreenTest, PamRefusingTheChangeIsReported) {
 }
 
 TEST(PasswordScreenTest, FailedStoreStillChangesAndWarns) {
-  json host = TulkTest::DemoHostState();
+  json host = DemoHostState();
   host["faults"]["HostMgr::Authentication::StoreUserAccountsToCs"] = "store is read-only";
   TestConsole console(ConsoleOptions(host));
   ASSERT_TRUE(OpenPasswordDialog(console));

@@ -137,11 +137,6 @@ std::string Capture(const std::string& commandLine) {
   return output;
 }
 
-::testing::AssertionResult WaitUntil(TestConsole& console, const std::function<bool()>& condition,
-                                     const std::string& what, std::chrono::milliseconds timeout) {
-  return console.WaitUntil(condition, what, timeout);
-}
-
 ::testing::AssertionResult Settled(TestConsole& console, const std::string& text) {
   if (auto shown = console.WaitForText(text); !shown) {
     return shown;

@@ -103,12 +103,6 @@ std::string Capture(const std::string& commandLine);
 
 // ---- waits ----------------------------------------------------------------
 
-/// Waits until `condition` holds, pumping the console's output meanwhile;
-/// the failure names `what` and dumps the screen.
-::testing::AssertionResult WaitUntil(TestConsole& console, const std::function<bool()>& condition,
-                                     const std::string& what,
-                                     std::chrono::milliseconds timeout = kWait);
-
 /// Waits for `text` to appear (or, for Gone, to disappear) and for the
 /// console to have handled everything sent to it (TestConsole::WaitReady());
 /// fails when the settled screen no longer (or again) shows `text`.

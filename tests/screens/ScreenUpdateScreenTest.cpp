@@ -11,11 +11,7 @@
 
 namespace {
 
-using TulkTest::ConsoleOptions;
-using TulkTest::Options;
-using TulkTest::Settled;
-using TulkTest::TestConsole;
-using TulkTest::WaitUntil;
+using namespace TulkTest;
 
 constexpr char kWelcomeFooter[] = "Customize System/View Logs";
 
@@ -69,7 +65,7 @@ TEST(ScreenUpdateScreenTest, LineDrawingSetAndLoginWithoutTheWelcomeScreenBetwee
     console.Key("F2");
     ASSERT_TRUE(Settled(console, "Authentication Required"));
     console.Key("Down");
-    console.Type(TulkTest::kRootPassword);
+    console.Type(kRootPassword);
     ASSERT_TRUE(console.WaitReady());
     const std::size_t before = console.Output().size();
     console.Key("Enter");
@@ -91,8 +87,8 @@ TEST(ScreenUpdateScreenTest, KeyThatEndsTheDimmedStateSendsTheScreenOnce) {
   // Dimmed, and waiting for a key again (a readiness record after the one
   // that came before the dimming).
   const auto awake = console.ReadyAt();
-  ASSERT_TRUE(WaitUntil(
-      console, [&] { return console.At(row, 40).bg == Tulk::kBlack && console.ReadyAt() > awake; },
+  ASSERT_TRUE(console.WaitUntil(
+      [&] { return console.At(row, 40).bg == Tulk::kBlack && console.ReadyAt() > awake; },
       "the dimmed screen"));
   const std::size_t before = console.Output().size();
   console.Type("x");

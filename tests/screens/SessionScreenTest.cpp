@@ -8,14 +8,8 @@
 
 namespace {
 
+using namespace TulkTest;
 using nlohmann::json;
-using TulkTest::ConsoleOptions;
-using TulkTest::CountLog;
-using TulkTest::Gone;
-using TulkTest::LogIn;
-using TulkTest::RecordsWhere;
-using TulkTest::Settled;
-using TulkTest::TestConsole;
 
 // Esc from the menu logs out; a SIGUSR2 during a later session exits after
 // its logout.
@@ -53,7 +47,7 @@ TEST(SessionScreenTest, EscFromTheMenuLogsOutAndSigusr2ExitsAfterLogout) {
 }
 
 TEST(SessionScreenTest, IdleTimeoutEndsTheSession) {
-  json host = TulkTest::DemoHostState();
+  json host = DemoHostState();
   host["advancedOptions"]["/UserVars/TulkTimeOut"] = 60;
   TulkTest::Options options = ConsoleOptions(host);
   options.timeScale = 30;  // the minute passes in two seconds
@@ -83,13 +77,13 @@ TEST(SessionScreenTest, KilledConsoleLeavesNoPamFolderBehind) {
     ASSERT_TRUE(LogIn(console));
     ASSERT_TRUE(Settled(console, "System Customization"));
     marker = console.Root().parent_path().string() + "/";
-    ASSERT_EQ(TulkTest::PamFoldersOf(marker).size(), 1u);
+    ASSERT_EQ(PamFoldersOf(marker).size(), 1u);
     console.Signal(SIGKILL);
     ASSERT_EQ(console.WaitExit(), 128 + SIGKILL);
     // Killed, pam_wrapper could not remove its folder itself.
-    EXPECT_EQ(TulkTest::PamFoldersOf(marker).size(), 1u);
+    EXPECT_EQ(PamFoldersOf(marker).size(), 1u);
   }
-  EXPECT_TRUE(TulkTest::PamFoldersOf(marker).empty());
+  EXPECT_TRUE(PamFoldersOf(marker).empty());
 }
 
 }  // namespace

@@ -16,7 +16,7 @@ constexpr char kCapture[] = "Collecting host agent live core information. Done."
 constexpr char kStopping[] = "Stopping management agents.";
 
 TEST(RestartAgentsScreenTest, OnlyF11RestartsAndOnlyEnterCloses) {
-  TestConsole console(DriverOptions(TulkTest::DemoHostState(), "agents"));
+  TestConsole console(DriverOptions(DemoHostState(), "agents"));
   ASSERT_TRUE(Settled(console, kQuestion));
   EXPECT_EQ(ForegroundOf(console, "Warning! Restarting"), 1);  // red
   console.Key("Enter");
@@ -36,7 +36,7 @@ TEST(RestartAgentsScreenTest, OnlyF11RestartsAndOnlyEnterCloses) {
   EXPECT_FALSE(console.Contains("Collecting"));
   EXPECT_EQ(CommandLines(console), (Lines{"services.sh stop", "services.sh start"}));
   EXPECT_EQ(LogLinesWith(console, "agents"), Lines{"Restarting host agents"});
-  const auto events = TulkTest::SimRecords(console.Root(), "events.jsonl");
+  const auto events = SimRecords(console.Root(), "events.jsonl");
   ASSERT_EQ(events.size(), 1U);
   EXPECT_EQ(events[0]["id"], "qob.user.tulk.restarting.hostagents");
   console.Key("Esc");
@@ -47,7 +47,7 @@ TEST(RestartAgentsScreenTest, OnlyF11RestartsAndOnlyEnterCloses) {
 }
 
 TEST(RestartAgentsScreenTest, CaptureIsDoneBeforeTheStopAndMayOutliveTheDialog) {
-  Json host = TulkTest::DemoHostState();
+  Json host = DemoHostState();
   host["commands"]["services.sh stop"] = {{"delayMs", 1500}};
   host["commands"]["hykbacktrace"] = {{"delayMs", 3000}};
   TestConsole console(DriverOptions(host, "agents"));

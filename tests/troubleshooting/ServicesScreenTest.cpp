@@ -123,7 +123,7 @@ TEST(ServicesScreenTest, FailingToolFallsBackToTheInitScriptAndSwitchesTheRulese
     ASSERT_TRUE(Settled(console, "Disable SSH"));
     EXPECT_EQ(CommandLines(console, "SSH start"), Lines{"SSH start"});
     EXPECT_EQ(CommandLines(console, "osk-cmd").back(), "osk-cmd -U root hostsvc/enable_ssh");
-    const Json state = TulkTest::ReadHostState(console.HostStatePath());
+    const Json state = ReadHostState(console.HostStatePath());
     EXPECT_EQ(state["services"]["SSH"]["running"], true);
     EXPECT_EQ(state["system"]["firewall"]["sshServer"]["enabled"], c.rulesetOpen);
     Lines warnings = {"Unable to run osk-cmd to start/stop ssh"};

@@ -48,8 +48,7 @@ int Submit(TestConsole& console, const std::vector<std::string>& fields, const c
   console.Key("Enter");
   int messages = 0;
   const auto next = [&] { return console.Contains(kLimit) || !console.Contains(title); };
-  while (TulkTest::WaitUntil(console, next, "a message or the closed dialog") &&
-         console.Contains(kLimit)) {
+  while (console.WaitUntil(next, "a message or the closed dialog") && console.Contains(kLimit)) {
     ++messages;
     console.Key("Enter");
     Gone(console, kLimit);
@@ -180,10 +179,10 @@ TEST(TimeoutsScreenTest, ConsoleTimeoutComparesStoredSeconds) {
 // Through the real console and its menus. The old timeout is a day; the
 // new minute ends the session without a new login.
 TEST(TimeoutsScreenTest, NewConsoleTimeoutEndsTheSessionItWasSetIn) {
-  TulkTest::Options options = TulkTest::ConsoleOptions(HostWithTimeouts(0, 0, 86400));
+  TulkTest::Options options = ConsoleOptions(HostWithTimeouts(0, 0, 86400));
   options.timeScale = 30;  // a console minute takes two seconds
   TestConsole console(options);
-  ASSERT_TRUE(TulkTest::LogIn(console));
+  ASSERT_TRUE(LogIn(console));
   ASSERT_TRUE(Settled(console, "System Customization"));
   ASSERT_TRUE(SelectEntry(console, "Troubleshooting Options"));
   console.Key("Enter");
