@@ -285,35 +285,12 @@ std::chrono::steady_clock::time_point TestConsole::ReadyAt() const {
 }
 
 ::testing::AssertionResult TestConsole::WaitForText(std::string_view text, Millis timeout) {
-  auto deadline = Clock::now() + timeout;
-  for (;;) {
-    Pump(0ms);
-    if (Contains(text)) {
-      return ::testing::AssertionSuccess();
-    }
-    if (Clock::now() >= deadline) {
-      return ::testing::AssertionFailure()
-             << "\"" << text << "\" did not appear within " << timeout.count() << " ms\n"
-             << Dump();
-    }
-    Pump(20ms);
-  }
+  return WaitUntil([&] { return Contains(text); }, "\"" + std::string(text) + "\" to appear",
+                   timeout);
 }
 
 ::testing::AssertionResult TestConsole::WaitForTextGone(std::string_view text, Millis timeout) {
-  auto deadline = Clock::now() + timeout;
-  for (;;) {
-    Pump(0ms);
-    if (!Contains(text)) {
-      return ::testing::AssertionSuccess();
-    }
-    if (Clock::now() >= deadline) {
-      return ::testing::AssertionFailure()
-             << "\"" << text << "\" still shown after " << timeout.count() << " ms\n"
-             << Dump();
-    }
-    Pump(20ms);
-  }
+  return WaitUntil([&] { return !Contains(text); }, "\"" + std::string(text) + "\" to go", timeout);
 }
 
 ::testing::AssertionResult TestConsole::WaitUntil(const std::function<bool()>& condition,
@@ -325,7 +302,9 @@ std::chrono::steady_clock::time_point TestConsole::ReadyAt() const {
       return ::testing::AssertionSuccess();
     }
     if (Clock::now() >= deadline) {
-      return ::testing::AssertionFailure() << "timed out waiting for " << what << "\n" << Dump();
+      return ::testing::AssertionFailure()
+             << "timed out waiting for " << what << " (" << timeout.count() << " ms)\n"
+             << Dump();
     }
     Pump(20ms);
   }

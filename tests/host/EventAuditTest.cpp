@@ -9,7 +9,6 @@
 #include "host/AuditLog.h"
 #include "host/EventReporter.h"
 #include "host/HostStartup.h"
-#include "platform/sim/DemoHost.h"
 #include "render/HostValues.h"
 
 namespace {
@@ -18,14 +17,8 @@ using HostTest::Logged;
 using HostTest::Records;
 using nlohmann::json;
 
-class EventAuditTest : public ::testing::Test {
+class EventAuditTest : public HostTest::HostStateTest {
  protected:
-  void SetUp() override {
-    HostTest::ClearLog();
-    HostTest::ClearRecords();
-    state_ = Sim::DemoHostState();
-    HostTest::WriteHostState(state_);
-  }
   void TearDown() override {
     if (Tulk::EventReportingOpen()) {
       Tulk::CloseEventReporting();
@@ -33,10 +26,8 @@ class EventAuditTest : public ::testing::Test {
   }
   void Fault(const std::string& operation, const std::string& message) {
     state_["faults"][operation] = message;
-    HostTest::WriteHostState(state_);
+    Apply();
   }
-
-  json state_;
 };
 
 TEST_F(EventAuditTest, EventOpensTheFacilityOnlyWhenItIsClosed) {

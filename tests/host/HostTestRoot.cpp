@@ -6,6 +6,8 @@
 #include <fstream>
 #include <sstream>
 
+#include "platform/sim/DemoHost.h"
+
 namespace HostTest {
 namespace {
 
@@ -109,6 +111,13 @@ void ClearRecords() {
   for (const char* file : {"commands.jsonl", "events.jsonl", "audit.jsonl"}) {
     fs::remove(g_root / "var/log/tulk-sim" / file);
   }
+}
+
+void HostStateTest::SetUp() {
+  ClearLog();
+  ClearRecords();
+  state_ = Sim::DemoHostState();
+  Apply();
 }
 
 }  // namespace HostTest

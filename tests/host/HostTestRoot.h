@@ -7,6 +7,8 @@
 // TULK_LOG_FILE and TULK_HOST_STATE, and removes it afterwards
 // (TULK_KEEP_TEST_ROOT keeps it).
 
+#include <gtest/gtest.h>
+
 #include <filesystem>
 #include <nlohmann/json.hpp>
 #include <string>
@@ -35,5 +37,17 @@ nlohmann::json ReadHostState();
 /// records, tool invocations); ClearRecords() removes them all.
 std::vector<nlohmann::json> Records(const char* file);
 void ClearRecords();
+
+/// A test on the demo host: the log and the record files are emptied and
+/// the demo host's state written before it; Apply() writes `state_` again
+/// after a change.
+class HostStateTest : public ::testing::Test {
+ protected:
+  void SetUp() override;
+  void Apply() { WriteHostState(state_); }
+  nlohmann::json& Network() { return state_["network"]; }
+
+  nlohmann::json state_;
+};
 
 }  // namespace HostTest

@@ -12,7 +12,6 @@
 #include "host/HostValueProviders.h"
 #include "host/ManagementNetwork.h"
 #include "host/NetworkInventory.h"
-#include "platform/sim/DemoHost.h"
 #include "render/HostValues.h"
 
 namespace {
@@ -31,23 +30,13 @@ std::vector<Row> Query(bool (*query)(std::vector<Row>&), bool expected = true) {
   return rows;
 }
 
-class InventoryTest : public ::testing::Test {
+class InventoryTest : public HostTest::HostStateTest {
  protected:
-  void SetUp() override {
-    HostTest::ClearLog();
-    state_ = Sim::DemoHostState();
-    Apply();
-  }
-
-  void Apply() { HostTest::WriteHostState(state_); }
   void Fault(const std::string& operation, const std::string& message = "injected") {
     state_["faults"][operation] = message;
     Apply();
   }
-  json& Network() { return state_["network"]; }
   json& ManagementNic() { return Network()["hykernelNics"][0]; }
-
-  json state_;
 };
 
 TEST_F(InventoryTest, KernelNicColumnsFollowTheAttachment) {

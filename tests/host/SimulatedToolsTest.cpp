@@ -11,7 +11,6 @@
 #include "host/OpsAgent.h"
 #include "include/Constants.h"
 #include "include/ProcessFlags.h"
-#include "platform/sim/DemoHost.h"
 
 namespace {
 
@@ -31,13 +30,10 @@ Lines ToolRuns() {
   return runs;
 }
 
-class SimulatedToolsTest : public ::testing::Test {
+class SimulatedToolsTest : public HostTest::HostStateTest {
  protected:
   void SetUp() override {
-    HostTest::ClearLog();
-    HostTest::ClearRecords();
-    state_ = Sim::DemoHostState();
-    HostTest::WriteHostState(state_);
+    HostStateTest::SetUp();
     Tulk::currentUser = "root";
   }
   void TearDown() override { Tulk::currentUser.clear(); }
@@ -46,10 +42,8 @@ class SimulatedToolsTest : public ::testing::Test {
   // `exitCode`, printing `output`.
   void Override(const std::string& command, int exitCode, const std::string& output = "") {
     state_["commands"][command] = {{"exitCode", exitCode}, {"stdout", output}};
-    HostTest::WriteHostState(state_);
+    Apply();
   }
-
-  nlohmann::json state_;
 };
 
 TEST_F(SimulatedToolsTest, PowerOffTerminatesOnlyWhenNotGraceful) {
@@ -123,7 +117,7 @@ TEST_F(SimulatedToolsTest, OverlayAgentPresenceAndVersion) {
                  Case{"2.9.0-1", true, false}, Case{"3.2.1", false, false}}) {
     state_["packages"]["zyo-opsagent"]["version"] = c.version;
     state_["services"]["zyo-opsagent"]["installed"] = c.installed;
-    HostTest::WriteHostState(state_);
+    Apply();
     HostTest::ClearLog();
     EXPECT_EQ(Tulk::HasOpsAgentVersion3OrLater(), c.expected) << c.version;
     EXPECT_EQ(Logged("<14>zyo-opsagent version >= 3 detected"), c.expected);

@@ -49,18 +49,13 @@ int Resolve(const std::string& name) {
   return result->Get();
 }
 
-class HostsFileTest : public ::testing::Test {
+class HostsFileTest : public HostTest::HostStateTest {
  protected:
   void SetUp() override {
-    HostTest::ClearLog();
+    HostStateTest::SetUp();
     fs::remove(At(kHostsBackup));
     Write(At(kHostsFile), kHosts);
-    state_ = Sim::DemoHostState();
-    Apply();
   }
-  void Apply() { HostTest::WriteHostState(state_); }
-
-  json state_;
 };
 
 TEST_F(HostsFileTest, BackupAndRestoreGiveTheFileBackByteForByte) {

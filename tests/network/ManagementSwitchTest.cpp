@@ -12,7 +12,6 @@
 #include "HostTestRoot.h"
 #include "host/ManagementSettings.h"
 #include "host/ManagementSwitch.h"
-#include "platform/sim/DemoHost.h"
 
 namespace Tulk {
 namespace {
@@ -21,21 +20,12 @@ using HostTest::Logged;
 using nlohmann::json;
 using Names = std::vector<std::string>;
 
-class ManagementSwitchTest : public ::testing::Test {
+class ManagementSwitchTest : public HostTest::HostStateTest {
  protected:
-  void SetUp() override {
-    HostTest::ClearLog();
-    state_ = Sim::DemoHostState();
-    Apply();
-  }
-  void Apply() { HostTest::WriteHostState(state_); }
-  json& Network() { return state_["network"]; }
   json& Nic() { return Network()["hykernelNics"][0]; }
   json Teaming(int index) {
     return HostTest::ReadHostState()["network"]["switches"][index]["teaming"];
   }
-
-  json state_;
 };
 
 TEST_F(ManagementSwitchTest, TeamingPolicyFollowsAddAndRemove) {

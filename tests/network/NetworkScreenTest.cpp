@@ -7,25 +7,16 @@
 #include <algorithm>
 
 #include "NetworkTestSupport.h"
-#include "SessionTestSupport.h"
+#include "ScreenTestSupport.h"
 #include "include/ColorNumbers.h"
 
 namespace {
 
-using NetworkTest::CloseDialog;
-using NetworkTest::HostState;
-using NetworkTest::Logged;
-using NetworkTest::OpenDialog;
-using NetworkTest::OpenWindow;
-using NetworkTest::RightPane;
-using TulkTest::Gone;
-using TulkTest::Settled;
-using TulkTest::TestConsole;
+using namespace TulkTest;
 using Json = nlohmann::json;
 
 ::testing::AssertionResult PaneShows(TestConsole& console, const std::string& row) {
-  return TulkTest::WaitUntil(
-      console,
+  return console.WaitUntil(
       [&] {
         const std::vector<std::string> rows = RightPane(console);
         return std::find(rows.begin(), rows.end(), row) != rows.end();
@@ -81,10 +72,10 @@ void ChangeEverything(TestConsole& console) {
 }
 
 TEST(NetworkWindowScreenTest, EveryEntryChangedAppliedAndSeenAgain) {
-  TestConsole console(NetworkTest::Options());
+  TestConsole console(ConsoleOptions());
   ASSERT_TRUE(OpenWindow(console));
   ChangeEverything(console);
-  ASSERT_TRUE(NetworkTest::ApplyChanges(console));
+  ASSERT_TRUE(ApplyChanges(console));
 
   const Json network = HostState(console)["network"];
   EXPECT_EQ(network["switches"][0]["uplinks"], Json({"hynic0", "hynic1", "hynic2"}));
@@ -98,7 +89,7 @@ TEST(NetworkWindowScreenTest, EveryEntryChangedAppliedAndSeenAgain) {
 
   // The menu's own description (the menu is back at its first entry) and,
   // after logging out, the welcome screen show the new address.
-  ASSERT_TRUE(NetworkTest::Select(console, "Configure Management Network"));
+  ASSERT_TRUE(SelectEntry(console, "Configure Management Network"));
   EXPECT_TRUE(console.WaitForText("10.20.30.50"));
   console.Key("Esc");
   EXPECT_TRUE(Settled(console, "https://10.20.30.50/ (STATIC)"));
@@ -115,20 +106,20 @@ TEST(NetworkWindowScreenTest, EveryEntryChangedAppliedAndSeenAgain) {
       {"Custom DNS Suffixes", "lab.example.net, a.example,"},
   };
   for (const auto& [entry, row] : shown) {
-    ASSERT_TRUE(NetworkTest::Select(console, entry));
+    ASSERT_TRUE(SelectEntry(console, entry));
     EXPECT_TRUE(PaneShows(console, row)) << entry;
   }
 }
 
 TEST(NetworkWindowScreenTest, LeavingAsksOnlyAfterARealChange) {
-  Json host = TulkTest::DemoHostState();
+  Json host = DemoHostState();
   Json& nic = host["network"]["hykernelNics"][0];
   nic["ipv4"]["mode"] = "dhcp";
   nic["dhcpLease"] = {{"bound", true},
                       {"address", "10.20.30.141"},
                       {"netmask", "255.255.255.0"},
                       {"gateway", "10.20.30.1"}};
-  TestConsole console(NetworkTest::Options(host));
+  TestConsole console(ConsoleOptions(host));
   ASSERT_TRUE(OpenWindow(console));
 
   // The IPv4 dialog of a DHCP host confirmed without an edit: no question.
@@ -139,7 +130,7 @@ TEST(NetworkWindowScreenTest, LeavingAsksOnlyAfterARealChange) {
   EXPECT_FALSE(console.Contains("Configure Management Network: Confirm"));
 
   // Esc in the question keeps the edits; N drops them.
-  ASSERT_TRUE(NetworkTest::Select(console, "Configure Management Network"));
+  ASSERT_TRUE(SelectEntry(console, "Configure Management Network"));
   console.Key("Enter");
   ASSERT_TRUE(Settled(console, "Custom DNS Suffixes"));
   ASSERT_TRUE(OpenDialog(console, "VLAN (optional)", "VLAN ID (1-4094"));
@@ -177,7 +168,7 @@ void SwitchIpv6OffAndApply(TestConsole& console) {
 
 TEST(NetworkWindowScreenTest, Ipv6ChangeRestartsLaterOrNow) {
   {
-    TestConsole console(NetworkTest::Options());
+    TestConsole console(ConsoleOptions());
     SwitchIpv6OffAndApply(console);
     console.Key("Esc");  // later
     ASSERT_TRUE(Settled(console, "System Customization"));
@@ -186,15 +177,15 @@ TEST(NetworkWindowScreenTest, Ipv6ChangeRestartsLaterOrNow) {
     EXPECT_EQ(host["network"]["ipv6Enabled"], true);
     EXPECT_EQ(host["power"], "on");
   }
-  TestConsole console(NetworkTest::Options());
+  TestConsole console(ConsoleOptions());
   SwitchIpv6OffAndApply(console);
   console.Key("F11");
   ASSERT_TRUE(Settled(console, "Restart in progress..."));
-  ASSERT_TRUE(TulkTest::WaitUntil(
-      console, [&] { return HostState(console)["power"] == "rebooting"; }, "the reboot"));
+  ASSERT_TRUE(
+      console.WaitUntil([&] { return HostState(console)["power"] == "rebooting"; }, "the reboot"));
   EXPECT_EQ(HostState(console)["network"]["ipv6Enabled"], false);
   // The agent refresh ran before the reboot started.
-  const std::vector<std::string> commands = SessionTest::CommandLines(console);
+  const std::vector<std::string> commands = CommandLines(console);
   const auto refresh =
       std::find(commands.begin(), commands.end(), "osk-cmd -U root internalsvc/refresh");
   const auto reboot = std::find(commands.begin(), commands.end(), "reboot");
@@ -203,9 +194,9 @@ TEST(NetworkWindowScreenTest, Ipv6ChangeRestartsLaterOrNow) {
 }
 
 TEST(NetworkWindowScreenTest, AFailedIpv6StepIsShownAndTheRestGoesOn) {
-  Json host = TulkTest::DemoHostState();
+  Json host = DemoHostState();
   host["faults"]["NetworkInfoImpl::SetHykIpv6Enabled"] = "IPv6 module busy";
-  TestConsole console(NetworkTest::Options(host));
+  TestConsole console(ConsoleOptions(host));
   ASSERT_TRUE(OpenWindow(console));
   ASSERT_TRUE(OpenDialog(console, "IPv6 Configuration", "Use DHCPv6"));
   console.Key("Space");
@@ -224,29 +215,29 @@ TEST(NetworkWindowScreenTest, AFailedIpv6StepIsShownAndTheRestGoesOn) {
 }
 
 TEST(NetworkWindowScreenTest, DistributedSwitchGreysAdaptersAndVlan) {
-  Json host = TulkTest::DemoHostState();
+  Json host = DemoHostState();
   host["network"]["switches"].push_back(
       {{"name", "dvs-lab"}, {"type", "distributed"}, {"uplinks", {"hynic3"}}});
   host["network"]["hykernelNics"][0]["connection"] = {
       {"type", "dvsPort"}, {"switch", "dvs-lab"}, {"portId", "17"}};
-  TestConsole console(NetworkTest::Options(host));
+  TestConsole console(ConsoleOptions(host));
   ASSERT_TRUE(OpenWindow(console));
-  EXPECT_EQ(NetworkTest::RightTitle(console), "IPv4 Configuration");
+  EXPECT_EQ(RightTitle(console), "IPv4 Configuration");
   EXPECT_EQ(console.At(4, 4).fg, Tulk::kDarkGrey);  // "Network Adapters"
   EXPECT_EQ(console.At(5, 4).fg, Tulk::kDarkGrey);  // "VLAN (optional)"
   console.Key("Up");
   console.WaitReady();
-  EXPECT_EQ(NetworkTest::RightTitle(console), "IPv4 Configuration");
+  EXPECT_EQ(RightTitle(console), "IPv4 Configuration");
   console.Key("Esc");
   EXPECT_TRUE(Settled(console, "System Customization"));
 }
 
 TEST(NetworkWindowScreenTest, ManagementInterfaceGoneBeforeEntry) {
-  TestConsole console(NetworkTest::Options());
-  ASSERT_TRUE(NetworkTest::OpenMenu(console));
+  TestConsole console(ConsoleOptions());
+  ASSERT_TRUE(OpenMenuEntry(console, "Configure Management Network"));
   Json host = HostState(console);
   host["network"]["managementInterface"] = "";
-  TulkTest::ReplaceHostState(console, host);
+  ReplaceHostState(console, host);
   console.Key("Enter");
   ASSERT_TRUE(Settled(console, "Enable Management Network: Error"));
   EXPECT_TRUE(console.Contains("Management network interface cannot be found."));

@@ -25,8 +25,14 @@ Options KeyEcho() {
   return options;
 }
 
-TEST(KeyLoop, TerminalSequencesArriveAsCursesKeys) {
-  TestConsole console(KeyEcho());
+// Terminal sequences arrive as curses keys, a lone Esc as Esc, a key right
+// after Esc without delay; readiness comes only once every key sent has
+// been handled; the reload signal reaches the current frame; a normal end
+// writes the palette reset.
+TEST(KeyLoop, KeysReadinessReloadAndANormalEnd) {
+  Options options = KeyEcho();
+  options.keepOutput = true;
+  TestConsole console(options);
   ASSERT_TRUE(console.WaitForText("KEYECHO active"));
   struct Case {
     const char* bytes;
@@ -56,40 +62,40 @@ TEST(KeyLoop, TerminalSequencesArriveAsCursesKeys) {
     EXPECT_TRUE(console.Contains("keys: " + std::to_string(keys))) << c.shown << console.Dump();
     EXPECT_TRUE(console.Contains(std::string("last key: ") + c.shown)) << console.Dump();
   }
-}
 
-TEST(KeyLoop, LoneEscArrivesAsEsc) {
-  TestConsole console(KeyEcho());
-  ASSERT_TRUE(console.WaitReady());
   console.Key("Esc");
   ASSERT_TRUE(console.WaitReady());
-  EXPECT_TRUE(console.Contains("keys: 1")) << console.Dump();
+  EXPECT_TRUE(console.Contains("keys: 13")) << console.Dump();
   EXPECT_TRUE(console.Contains("(27)")) << console.Dump();
-}
 
-TEST(KeyLoop, KeyRightAfterEscIsNotHeldBack) {
-  TestConsole console(KeyEcho());
-  ASSERT_TRUE(console.WaitForText("KEYECHO active"));
   // Both bytes in one write: curses reads the second while it checks
   // whether the Esc starts a sequence, and must still deliver it at once.
   console.Send(
       "\x1b"
       "a");
   ASSERT_TRUE(console.WaitReady());
-  EXPECT_TRUE(console.Contains("keys: 2")) << console.Dump();
+  EXPECT_TRUE(console.Contains("keys: 15")) << console.Dump();
   EXPECT_TRUE(console.Contains("last key: a (97)")) << console.Dump();
-}
 
-TEST(KeyLoop, ReadyOnlyOnceEveryKeySentHasBeenHandled) {
-  TestConsole console(KeyEcho());
-  ASSERT_TRUE(console.WaitReady());
   // Separate writes: the console may finish a key before the next arrives,
   // and its report in between must not count as the end of the last one.
   for (const char* key : {"a", "b", "c", "d"}) {
     console.Send(key);
   }
   ASSERT_TRUE(console.WaitReady());
-  EXPECT_TRUE(console.Contains("keys: 4")) << console.Dump();
+  EXPECT_TRUE(console.Contains("keys: 19")) << console.Dump();
+
+  ASSERT_TRUE(console.WaitForText("reloads: 0"));
+  console.Signal(SIGUSR1);
+  ASSERT_TRUE(console.WaitForText("reloads: 1"));
+  console.Signal(SIGUSR1);
+  ASSERT_TRUE(console.WaitForText("reloads: 2"));
+
+  console.Type("q");
+  EXPECT_EQ(console.WaitExit(), 0);
+  const std::string& output = console.Output();
+  ASSERT_GE(output.size(), 3u);
+  EXPECT_EQ(output.substr(output.size() - 3), "\x1b]R");
 }
 
 TEST(KeyLoop, ReadinessDescriptorOnTheTerminalIsIgnored) {
@@ -170,15 +176,6 @@ TEST(KeyLoop, UnreadableTimeoutDefaultsToTenMinutes) {
   ASSERT_TRUE(console.WaitForText("idle timeout: 600"));
 }
 
-TEST(KeyLoop, ReloadSignalReachesTheCurrentFrame) {
-  TestConsole console(KeyEcho());
-  ASSERT_TRUE(console.WaitForText("reloads: 0"));
-  console.Signal(SIGUSR1);
-  ASSERT_TRUE(console.WaitForText("reloads: 1"));
-  console.Signal(SIGUSR1);
-  ASSERT_TRUE(console.WaitForText("reloads: 2"));
-}
-
 TEST(KeyLoop, ExitRequestDuringASessionIsDeferred) {
   Options options = KeyEcho();
   options.env["TULK_KEYECHO_SESSION"] = "1";
@@ -196,18 +193,6 @@ TEST(KeyLoop, ExitRequestDuringASessionIsDeferred) {
   }
   EXPECT_TRUE(shown) << console.Dump();
   EXPECT_TRUE(console.Running());
-}
-
-TEST(KeyLoop, NormalEndWritesThePaletteReset) {
-  Options options = KeyEcho();
-  options.keepOutput = true;
-  TestConsole console(options);
-  ASSERT_TRUE(console.WaitForText("KEYECHO active"));
-  console.Type("q");
-  EXPECT_EQ(console.WaitExit(), 0);
-  const std::string& output = console.Output();
-  ASSERT_GE(output.size(), 3u);
-  EXPECT_EQ(output.substr(output.size() - 3), "\x1b]R");
 }
 
 TEST(KeyLoop, SignalEndsWithoutThePaletteReset) {

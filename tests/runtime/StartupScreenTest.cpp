@@ -37,12 +37,22 @@ bool HasLine(const TestConsole& console, const std::string& line) {
   return false;
 }
 
-TEST(Startup, LogsStartAndWritesThePidFile) {
+// The start is logged and the pid file written; a colour terminal is drawn
+// white on black; a resize logs the new size and ends the console.
+TEST(Startup, LogsStartDrawsInColourAndEndsOnResize) {
   TestConsole console;
   ASSERT_TRUE(console.WaitForLog("Starting TULK"));
   ASSERT_TRUE(console.WaitForText(kWelcomeText));
   EXPECT_TRUE(HasLine(console, "<14>Starting TULK"));
   EXPECT_EQ(ReadFile(console.Root() / "var/run/tulk.pid"), std::to_string(console.Pid()));
+  ASSERT_TRUE(console.WaitReady());
+  const TulkTest::Cell cell = console.At(0, 0);
+  EXPECT_EQ(cell.fg, Tulk::kWhite);
+  EXPECT_EQ(cell.bg, Tulk::kBlack);
+  EXPECT_FALSE(cell.reverse);
+  console.Resize(132, 43);
+  EXPECT_EQ(console.WaitExit(), 0);
+  EXPECT_TRUE(HasLine(console, "<14>Resized window to 132x43"));
 }
 
 TEST(Startup, LivePidFileIsKeptAndTheConsoleStillStarts) {
@@ -97,42 +107,20 @@ TEST(Startup, TerminatingSignalsExitZeroWithTheTerminalRestored) {
   }
 }
 
-TEST(Startup, ResizeLogsTheNewSizeAndExits) {
-  TestConsole console;
-  ASSERT_TRUE(console.WaitForText(kWelcomeText));
-  console.Resize(132, 43);
-  EXPECT_EQ(console.WaitExit(), 0);
-  EXPECT_TRUE(HasLine(console, "<14>Resized window to 132x43"));
-}
-
+// A terminal that cannot change colours (vt102, also the fallback for an
+// unset TERM) is drawn in standout.
 TEST(Startup, TerminalWithoutColourChangeDrawsInStandout) {
-  Options options;
-  options.term = "vt102";
-  TestConsole console(options);
-  ASSERT_TRUE(console.WaitReady());
-  ASSERT_TRUE(console.Contains(kWelcomeText)) << console.Dump();
-  TulkTest::Cell cell = console.At(0, 0);
-  EXPECT_EQ(cell.text, "┌");
-  EXPECT_TRUE(cell.reverse) << console.Dump();
-}
-
-TEST(Startup, ColourTerminalDrawsWhiteOnBlack) {
-  TestConsole console;
-  ASSERT_TRUE(console.WaitReady());
-  ASSERT_TRUE(console.Contains(kWelcomeText)) << console.Dump();
-  TulkTest::Cell cell = console.At(0, 0);
-  EXPECT_EQ(cell.fg, Tulk::kWhite);
-  EXPECT_EQ(cell.bg, Tulk::kBlack);
-  EXPECT_FALSE(cell.reverse);
-}
-
-TEST(Startup, UnsetTermFallsBackToVt102) {
-  Options options;
-  options.term = "";
-  TestConsole console(options);
-  ASSERT_TRUE(console.WaitReady());
-  ASSERT_TRUE(console.Contains(kWelcomeText)) << console.Dump();
-  EXPECT_TRUE(console.At(1, 2).reverse) << "vt102 cannot change colours: standout expected";
+  for (const char* term : {"vt102", ""}) {
+    SCOPED_TRACE(std::string("TERM=") + term);
+    Options options;
+    options.term = term;
+    TestConsole console(options);
+    ASSERT_TRUE(console.WaitReady());
+    ASSERT_TRUE(console.Contains(kWelcomeText)) << console.Dump();
+    EXPECT_EQ(console.At(0, 0).text, "┌");
+    EXPECT_TRUE(console.At(0, 0).reverse) << console.Dump();
+    EXPECT_TRUE(console.At(1, 2).reverse) << console.Dump();
+  }
 }
 
 TEST(Startup, MalformedHostStateIsReportedBeforeTheScreenStarts) {

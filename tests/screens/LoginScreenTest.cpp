@@ -6,21 +6,16 @@
 
 #include <ostream>
 
-#include "SessionTestSupport.h"
+#include "ScreenTestSupport.h"
 
 namespace {
 
+using namespace TulkTest;
 using nlohmann::json;
-using SessionTest::ConsoleOptions;
-using SessionTest::Gone;
-using SessionTest::LogIn;
-using SessionTest::RecordsWhere;
-using SessionTest::RowOf;
-using SessionTest::Settled;
-using TulkTest::DemoHostState;
-using TulkTest::TestConsole;
 
-TEST(LoginScreenTest, NamePasswordModeAndEscLeavesNoTrace) {
+// The name and password mode, Esc leaving no trace, typing that sends only
+// the changed cells, and F3 switching to the PIN mode and back.
+TEST(LoginScreenTest, NamePasswordAndPinModes) {
   TestConsole console(ConsoleOptions());
   ASSERT_TRUE(Settled(console, "To manage this host"));
   const std::size_t logBefore = console.LogLines().size();
@@ -41,11 +36,8 @@ TEST(LoginScreenTest, NamePasswordModeAndEscLeavesNoTrace) {
   EXPECT_EQ(console.LogLines().size(), logBefore);
   EXPECT_TRUE(RecordsWhere(console, "audit.jsonl", "event", "tulk.login").empty());
   EXPECT_FALSE(console.Cursor().visible);
-}
 
-TEST(LoginScreenTest, TypingSendsOnlyTheChangedCells) {
-  TestConsole console(ConsoleOptions());
-  ASSERT_TRUE(Settled(console, "Customize System/View Logs"));
+  // Typing sends only the changed cells.
   console.Key("F2");
   ASSERT_TRUE(Settled(console, "Login Name:        [ root "));
   // The first key replaces the pre-filled name, every later one adds a cell;
@@ -57,13 +49,7 @@ TEST(LoginScreenTest, TypingSendsOnlyTheChangedCells) {
     EXPECT_LT(console.BytesReceived() - before, 40u) << key;
   }
   EXPECT_TRUE(console.Contains("Login Name:        [ ops "));
-}
 
-TEST(LoginScreenTest, F3SwitchesBetweenPasswordAndPinMode) {
-  TestConsole console(ConsoleOptions());
-  ASSERT_TRUE(Settled(console, "Customize System/View Logs"));
-  console.Key("F2");
-  ASSERT_TRUE(Settled(console, "Login Name:"));
   console.Key("Down");
   console.Type("abc");
   console.Key("F3");
@@ -95,13 +81,13 @@ class FailedLoginTest : public ::testing::TestWithParam<FailedLogin> {};
 
 TEST_P(FailedLoginTest, IsLoggedAuditedPostedAndShown) {
   const FailedLogin& c = GetParam();
-  SessionTest::PamSetup pam;
+  PamSetup pam;
   pam.policy = {c.policy};
   TestConsole console(ConsoleOptions(DemoHostState(), pam));
   ASSERT_TRUE(LogIn(console, c.user, c.password));
   ASSERT_TRUE(Settled(console, c.message));
   EXPECT_TRUE(console.Contains("Authentication failed"));
-  EXPECT_EQ(SessionTest::CountLog(console, std::string("<35>") + c.logLine), 1);
+  EXPECT_EQ(CountLog(console, std::string("<35>") + c.logLine), 1);
   const auto audit = RecordsWhere(console, "audit.jsonl", "event", "tulk.login");
   ASSERT_EQ(audit.size(), 1u);
   EXPECT_EQ(audit[0]["result"], "failure");
@@ -144,11 +130,11 @@ TEST(LoginScreenTest, FailedLoginKeepsTheNameAndCanBeRetried) {
   ASSERT_TRUE(Gone(console, "Invalid login or password."));
   EXPECT_TRUE(console.Contains("Login Name:        [ root "));
   EXPECT_FALSE(console.Contains("*****"));
-  console.Type(SessionTest::kRootPassword);
+  console.Type(kRootPassword);
   console.Key("Enter");
   ASSERT_TRUE(Settled(console, "System Customization"));
-  EXPECT_EQ(SessionTest::CountLog(console, "<32>Authentication of user root succeeded"), 1);
-  EXPECT_EQ(SessionTest::CountLog(console, "<14>User root logged in"), 1);
+  EXPECT_EQ(CountLog(console, "<32>Authentication of user root succeeded"), 1);
+  EXPECT_EQ(CountLog(console, "<14>User root logged in"), 1);
   const auto logins = RecordsWhere(console, "audit.jsonl", "event", "tulk.login");
   ASSERT_EQ(logins.size(), 2u);
   EXPECT_EQ(logins[1]["result"], "success");
@@ -156,16 +142,16 @@ TEST(LoginScreenTest, FailedLoginKeepsTheNameAndCanBeRetried) {
 }
 
 TEST(LoginScreenTest, ExpiredPasswordIsChangedThenLoginAgain) {
-  SessionTest::PamSetup pam;
+  PamSetup pam;
   pam.policy = {"root:expired"};
   TestConsole console(ConsoleOptions(DemoHostState(), pam));
   ASSERT_TRUE(LogIn(console));
   ASSERT_TRUE(Settled(console, "Password has expired."));
   console.Key("Enter");
   ASSERT_TRUE(Settled(console, "Setting the password will prevent unauthorized access"));
-  console.Type(SessionTest::kRootPassword);
+  console.Type(kRootPassword);
   console.Key("Down");
-  ASSERT_TRUE(SessionTest::CursorOn(console, "New Password:"));
+  ASSERT_TRUE(CursorOn(console, "New Password:"));
   console.Type("fresh-1");
   console.Key("Down");
   console.Type("fresh-1");
@@ -173,8 +159,7 @@ TEST(LoginScreenTest, ExpiredPasswordIsChangedThenLoginAgain) {
   ASSERT_TRUE(Gone(console, "Confirm Password:"));
   ASSERT_TRUE(Settled(console, "Authentication Required"));
   EXPECT_FALSE(console.Contains("System Customization"));
-  EXPECT_NE(TulkTest::ReadText(SessionTest::PasswordFile(console)).find("root:fresh-1:"),
-            std::string::npos);
+  EXPECT_NE(ReadText(console.PamPasswordFile()).find("root:fresh-1:"), std::string::npos);
 
   console.Type("fresh-1");
   console.Key("Enter");
@@ -183,7 +168,7 @@ TEST(LoginScreenTest, ExpiredPasswordIsChangedThenLoginAgain) {
 }
 
 TEST(LoginScreenTest, EmptyPasswordMarksThePasswordNotSet) {
-  SessionTest::PamSetup pam;
+  PamSetup pam;
   pam.users = {{"root", ""}};
   TestConsole console(ConsoleOptions(DemoHostState(), pam));
   ASSERT_TRUE(LogIn(console, "root", ""));
@@ -194,14 +179,14 @@ TEST(LoginScreenTest, EmptyPasswordMarksThePasswordNotSet) {
 TEST(LoginScreenTest, SmartCardLoginAndRemoval) {
   json host = DemoHostState();
   host["smartCards"] = json::array({{{"userId", "cardholder"}, {"valid", true}}});
-  SessionTest::PamSetup pam;
+  PamSetup pam;
   pam.users["cardholder"] = "2468";
   TestConsole console(ConsoleOptions(host, pam));
   ASSERT_TRUE(Settled(console, "Customize System/View Logs"));
   console.Key("F2");
   ASSERT_TRUE(Settled(console, "Enter the smart card login PIN for"));
   EXPECT_TRUE(console.Contains("Login Id:          [ cardholder "));
-  EXPECT_EQ(SessionTest::CountLog(console, "<14>Found smart card with user id 'cardholder'"), 1);
+  EXPECT_EQ(CountLog(console, "<14>Found smart card with user id 'cardholder'"), 1);
   console.Key("Down");
   console.Type("2468");
   console.Key("Enter");
@@ -212,13 +197,13 @@ TEST(LoginScreenTest, SmartCardLoginAndRemoval) {
   ASSERT_TRUE(Settled(console, "Old Password:"));
 
   host["smartCards"][0]["valid"] = false;
-  TulkTest::ReplaceHostState(console, host);
+  ReplaceHostState(console, host);
   console.Signal(SIGUSR1);
   ASSERT_TRUE(console.WaitForLog("Logging out user id 'cardholder'"));
   EXPECT_EQ(console.WaitExit(), 0);
 }
 
-TEST(LoginScreenTest, KeyboardLabelOnALocalConsole) {
+TEST(LoginScreenTest, KeyboardLabelAndCursorOnALocalConsole) {
   TulkTest::Options options = ConsoleOptions();
   options.term = "xterm";
   TestConsole console(options);
@@ -229,48 +214,42 @@ TEST(LoginScreenTest, KeyboardLabelOnALocalConsole) {
   EXPECT_EQ(RowOf(console, "Login Name:"), label + 1);
   EXPECT_EQ(RowOf(console, "Password:"), label + 2);
   console.Key("Tab");
-  ASSERT_TRUE(SessionTest::CursorOn(console, "Login Name:"));
+  ASSERT_TRUE(CursorOn(console, "Login Name:"));
   console.Key("Up");
   console.Key("Enter");
   ASSERT_TRUE(Settled(console, "Configure Keyboard"));
   console.Key("Esc");
   ASSERT_TRUE(Gone(console, "Configure Keyboard"));
-  EXPECT_TRUE(console.Contains("Configured Keyboard (US Default)"));
-}
 
-// The cursor marks the selected item, the keyboard label included: at the
-// start of its text, on opening, after moving back to it and after the
-// keyboard dialog it opens.
-TEST(LoginScreenTest, CursorStandsOnTheKeyboardLabelWhileItIsSelected) {
-  TulkTest::Options options = ConsoleOptions();
-  options.term = "xterm";
-  TestConsole console(options);
-  ASSERT_TRUE(Settled(console, "Customize System/View Logs"));
+  // The cursor marks the selected item, the keyboard label included: at
+  // the start of its text, on opening, after moving back to it and after
+  // the keyboard dialog it opens.
+  console.Key("Esc");
+  ASSERT_TRUE(Gone(console, "Authentication Required"));
   console.Key("F2");
   ASSERT_TRUE(Settled(console, "Configured Keyboard (US Default)"));
-  const int label = RowOf(console, "Configured Keyboard");
   int column = -1;
   for (int col = 0; col < 70 && column < 0; ++col) {
-    if (SessionTest::Cells(console, label, col, 10) == "Configured") {
+    if (Cells(console, label, col, 10) == "Configured") {
       column = col;
     }
   }
   ASSERT_GE(column, 0);
   const auto onLabel = [&] {
-    const TulkTest::CursorState cursor = console.Cursor();
+    const CursorState cursor = console.Cursor();
     return cursor.visible && cursor.row == label && cursor.col == column;
   };
-  EXPECT_TRUE(WaitUntil(console, onLabel, "the cursor on the label")) << console.Dump();
+  EXPECT_TRUE(console.WaitUntil(onLabel, "the cursor on the label")) << console.Dump();
   console.Key("Tab");
-  ASSERT_TRUE(WaitUntil(
-      console, [&] { return console.Cursor().row == label + 1; }, "the login name"));
+  ASSERT_TRUE(
+      console.WaitUntil([&] { return console.Cursor().row == label + 1; }, "the login name"));
   console.Key("Up");
-  EXPECT_TRUE(WaitUntil(console, onLabel, "the cursor back on the label")) << console.Dump();
+  EXPECT_TRUE(console.WaitUntil(onLabel, "the cursor back on the label")) << console.Dump();
   console.Key("Enter");
   ASSERT_TRUE(Settled(console, "Configure Keyboard"));
   console.Key("Esc");
   ASSERT_TRUE(Gone(console, "Configure Keyboard"));
-  EXPECT_TRUE(WaitUntil(console, onLabel, "the cursor on the label after the dialog"))
+  EXPECT_TRUE(console.WaitUntil(onLabel, "the cursor on the label after the dialog"))
       << console.Dump();
 }
 

@@ -10,19 +10,12 @@
 #include <regex>
 #include <sstream>
 
-#include "SessionTestSupport.h"
+#include "ScreenTestSupport.h"
 
 namespace {
 
+using namespace TulkTest;
 using nlohmann::json;
-using SessionTest::ConsoleOptions;
-using SessionTest::CountLog;
-using SessionTest::Gone;
-using SessionTest::RecordsWhere;
-using SessionTest::RowOf;
-using SessionTest::Settled;
-using SessionTest::WaitUntil;
-using TulkTest::TestConsole;
 namespace fs = std::filesystem;
 using namespace std::chrono_literals;
 
@@ -67,13 +60,13 @@ std::string CommonStack(const std::string& type, const fs::path& folder) {
 // "nobody" stands for an ordinary user: pam_faillock counts only users the
 // machine's user database knows.
 std::unique_ptr<TestConsole> ShippedServiceConsole(bool lockout) {
-  SessionTest::PamSetup pam;
+  PamSetup pam;
   pam.users = {{"root", kRightPassword}, {"nobody", kRightPassword}};
-  TulkTest::Options options = ConsoleOptions(TulkTest::DemoHostState(), pam);
+  TulkTest::Options options = ConsoleOptions(DemoHostState(), pam);
   options.start = false;
   auto console = std::make_unique<TestConsole>(options);
   const fs::path folder = console->PamPasswordFile().parent_path();
-  std::string service = TulkTest::ReadText(TULK_TEST_PAM_SERVICE_FILE);
+  std::string service = ReadText(TULK_TEST_PAM_SERVICE_FILE);
   if (lockout) {
     service = WithLockout(service);
   }
@@ -91,8 +84,8 @@ std::unique_ptr<TestConsole> ShippedServiceConsole(bool lockout) {
 // Waits for failed attempt number `count` of `user` and closes its message.
 ::testing::AssertionResult Failed(TestConsole& console, const std::string& user, int count) {
   const std::string line = "<35>Authentication of user " + user + " failed";
-  if (auto logged = WaitUntil(
-          console, [&] { return CountLog(console, line) == count; }, line, kAttemptDeadline);
+  if (auto logged = console.WaitUntil([&] { return CountLog(console, line) == count; }, line,
+                                      kAttemptDeadline);
       !logged) {
     return logged;
   }
@@ -103,7 +96,9 @@ std::unique_ptr<TestConsole> ShippedServiceConsole(bool lockout) {
   return Gone(console, kInvalid);
 }
 
-TEST(PamServiceScreenTest, FailedLoginIsDelayedAndTheRightPasswordLogsIn) {
+// A failed login is delayed, the right password then logs in, and a
+// password change goes through the common password stack.
+TEST(PamServiceScreenTest, FailedLoginIsDelayedThenLoginAndPasswordChange) {
   std::unique_ptr<TestConsole> console = ShippedServiceConsole(false);
   ASSERT_TRUE(Settled(*console, "Customize System/View Logs"));
   console->Key("F2");
@@ -112,8 +107,8 @@ TEST(PamServiceScreenTest, FailedLoginIsDelayedAndTheRightPasswordLogsIn) {
   console->Type("wrong");
   const auto pressed = std::chrono::steady_clock::now();
   console->Key("Enter");
-  ASSERT_TRUE(WaitUntil(
-      *console, [&] { return CountLog(*console, "<35>Authentication of user root failed") == 1; },
+  ASSERT_TRUE(console->WaitUntil(
+      [&] { return CountLog(*console, "<35>Authentication of user root failed") == 1; },
       "the failed login", kAttemptDeadline));
   EXPECT_GE(std::chrono::steady_clock::now() - pressed, kLeastDelay);
   ASSERT_TRUE(Settled(*console, kInvalid));
@@ -124,26 +119,20 @@ TEST(PamServiceScreenTest, FailedLoginIsDelayedAndTheRightPasswordLogsIn) {
   console->Key("Enter");
   ASSERT_TRUE(Settled(*console, "System Customization"));
   EXPECT_EQ(CountLog(*console, "<32>Authentication of user root succeeded"), 1);
-}
 
-TEST(PamServiceScreenTest, PasswordChangeGoesThroughTheCommonPasswordStack) {
-  std::unique_ptr<TestConsole> console = ShippedServiceConsole(false);
-  ASSERT_TRUE(SessionTest::LogIn(*console, "root", kRightPassword));
-  ASSERT_TRUE(Settled(*console, "System Customization"));
   console->Key("Enter");  // Configure Password
   ASSERT_TRUE(Settled(*console, "Old Password:"));
   console->Type(kRightPassword);
   console->Key("Down");
-  ASSERT_TRUE(WaitUntil(
-      *console, [&] { return console->Cursor().row == RowOf(*console, "New Password:"); },
-      "the new-password field"));
+  ASSERT_TRUE(
+      console->WaitUntil([&] { return console->Cursor().row == RowOf(*console, "New Password:"); },
+                         "the new-password field"));
   console->Type("fresh-2");
   console->Key("Down");
   console->Type("fresh-2");
   console->Key("Enter");
   ASSERT_TRUE(console->WaitForLog("Login password for user root has changed"));
-  EXPECT_NE(TulkTest::ReadText(console->PamPasswordFile()).find("root:fresh-2:"),
-            std::string::npos);
+  EXPECT_NE(ReadText(console->PamPasswordFile()).find("root:fresh-2:"), std::string::npos);
 }
 
 struct Lockout {
@@ -160,7 +149,7 @@ class LockoutTest : public ::testing::TestWithParam<Lockout> {};
 TEST_P(LockoutTest, ThreeFailuresLockOrdinaryUsersOnly) {
   const Lockout& c = GetParam();
   std::unique_ptr<TestConsole> console = ShippedServiceConsole(true);
-  ASSERT_TRUE(SessionTest::LogIn(*console, c.user, "wrong"));
+  ASSERT_TRUE(LogIn(*console, c.user, "wrong"));
   ASSERT_TRUE(Failed(*console, c.user, 1));
   for (int attempt = 2; attempt <= 3; ++attempt) {
     console->Type("wrong");
@@ -180,9 +169,8 @@ TEST_P(LockoutTest, ThreeFailuresLockOrdinaryUsersOnly) {
     EXPECT_EQ(audit[3]["user"], c.user);
     EXPECT_EQ(audit[3]["attributes"], json({{"reason", "Invalid login"}}));
   } else {
-    ASSERT_TRUE(WaitUntil(
-        *console, [&] { return console->Contains("System Customization"); }, "the menu",
-        kAttemptDeadline));
+    ASSERT_TRUE(console->WaitUntil([&] { return console->Contains("System Customization"); },
+                                   "the menu", kAttemptDeadline));
     const auto audit = logins();
     ASSERT_EQ(audit.size(), 4u);
     EXPECT_EQ(audit[3]["result"], "success");

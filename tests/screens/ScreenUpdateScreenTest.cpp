@@ -6,16 +6,12 @@
 
 #include <string>
 
-#include "SessionTestSupport.h"
+#include "ScreenTestSupport.h"
 #include "include/ColorNumbers.h"
 
 namespace {
 
-using SessionTest::ConsoleOptions;
-using SessionTest::Settled;
-using SessionTest::WaitUntil;
-using TulkTest::Options;
-using TulkTest::TestConsole;
+using namespace TulkTest;
 
 constexpr char kWelcomeFooter[] = "Customize System/View Logs";
 
@@ -42,7 +38,9 @@ std::string Repeated(const std::string& text, int times) {
   return out;
 }
 
-TEST(ScreenUpdateScreenTest, HorizontalLinesGoOutInTheTerminalsLineDrawingSet) {
+// Horizontal lines go out in the terminal's line-drawing set; a login then
+// sends the menu without the welcome screen between.
+TEST(ScreenUpdateScreenTest, LineDrawingSetAndLoginWithoutTheWelcomeScreenBetween) {
   struct Case {
     const char* term;
     const char* enterSet;
@@ -62,27 +60,21 @@ TEST(ScreenUpdateScreenTest, HorizontalLinesGoOutInTheTerminalsLineDrawingSet) {
     EXPECT_EQ(console.Row(24), "\u2514" + Repeated("\u2500", 78) + "\u2518") << c.term;
     EXPECT_EQ(console.At(1, 0).text, "\u2502") << c.term;
     EXPECT_EQ(console.At(1, 79).text, "\u2502") << c.term;
+
+    // A login sends the menu without the welcome screen between.
+    console.Key("F2");
+    ASSERT_TRUE(Settled(console, "Authentication Required"));
+    console.Key("Down");
+    console.Type(kRootPassword);
+    ASSERT_TRUE(console.WaitReady());
+    const std::size_t before = console.Output().size();
+    console.Key("Enter");
+    ASSERT_TRUE(Settled(console, "System Customization"));
+    // Drawing the welcome screen active again between the dialog and the
+    // menu would send its footer once more.
+    EXPECT_EQ(console.Output().find(kWelcomeFooter, before), std::string::npos) << c.term;
     Close(console);
   }
-}
-
-TEST(ScreenUpdateScreenTest, LoginSendsTheMenuWithoutTheWelcomeScreenBetween) {
-  Options options = ConsoleOptions();
-  options.keepOutput = true;
-  TestConsole console(options);
-  ASSERT_TRUE(Settled(console, kWelcomeFooter));
-  console.Key("F2");
-  ASSERT_TRUE(Settled(console, "Authentication Required"));
-  console.Key("Down");
-  console.Type(SessionTest::kRootPassword);
-  ASSERT_TRUE(console.WaitReady());
-  const std::size_t before = console.Output().size();
-  console.Key("Enter");
-  ASSERT_TRUE(Settled(console, "System Customization"));
-  // Drawing the welcome screen active again between the dialog and the
-  // menu would send its footer once more.
-  EXPECT_EQ(console.Output().find(kWelcomeFooter, before), std::string::npos);
-  Close(console);
 }
 
 TEST(ScreenUpdateScreenTest, KeyThatEndsTheDimmedStateSendsTheScreenOnce) {
@@ -95,8 +87,8 @@ TEST(ScreenUpdateScreenTest, KeyThatEndsTheDimmedStateSendsTheScreenOnce) {
   // Dimmed, and waiting for a key again (a readiness record after the one
   // that came before the dimming).
   const auto awake = console.ReadyAt();
-  ASSERT_TRUE(WaitUntil(
-      console, [&] { return console.At(row, 40).bg == Tulk::kBlack && console.ReadyAt() > awake; },
+  ASSERT_TRUE(console.WaitUntil(
+      [&] { return console.At(row, 40).bg == Tulk::kBlack && console.ReadyAt() > awake; },
       "the dimmed screen"));
   const std::size_t before = console.Output().size();
   console.Type("x");

@@ -4,20 +4,16 @@
 #include <signal.h>
 
 #include "ProcessHygiene.h"
-#include "SessionTestSupport.h"
+#include "ScreenTestSupport.h"
 
 namespace {
 
+using namespace TulkTest;
 using nlohmann::json;
-using SessionTest::ConsoleOptions;
-using SessionTest::CountLog;
-using SessionTest::Gone;
-using SessionTest::LogIn;
-using SessionTest::RecordsWhere;
-using SessionTest::Settled;
-using TulkTest::TestConsole;
 
-TEST(SessionScreenTest, EscFromTheMenuLogsOut) {
+// Esc from the menu logs out; a SIGUSR2 during a later session exits after
+// its logout.
+TEST(SessionScreenTest, EscFromTheMenuLogsOutAndSigusr2ExitsAfterLogout) {
   TestConsole console(ConsoleOptions());
   ASSERT_TRUE(LogIn(console));
   ASSERT_TRUE(Settled(console, "System Customization"));
@@ -36,10 +32,22 @@ TEST(SessionScreenTest, EscFromTheMenuLogsOut) {
   ASSERT_TRUE(Settled(console, "System Customization"));
   console.Key("Esc");
   ASSERT_TRUE(console.WaitForLog("User operator logged out"));
+
+  ASSERT_TRUE(LogIn(console));
+  ASSERT_TRUE(Settled(console, "System Customization"));
+  console.Signal(SIGUSR2);
+  console.Key("Down");
+  ASSERT_TRUE(console.WaitReady());
+  EXPECT_TRUE(console.Running());
+  EXPECT_TRUE(console.Contains("System Customization"));
+  console.Key("Esc");
+  EXPECT_EQ(console.WaitExit(), 0);
+  EXPECT_EQ(CountLog(console, "<14>User root logged out"), 2);
+  EXPECT_EQ(RecordsWhere(console, "audit.jsonl", "event", "tulk.logout").size(), 3u);
 }
 
 TEST(SessionScreenTest, IdleTimeoutEndsTheSession) {
-  json host = TulkTest::DemoHostState();
+  json host = DemoHostState();
   host["advancedOptions"]["/UserVars/TulkTimeOut"] = 60;
   TulkTest::Options options = ConsoleOptions(host);
   options.timeScale = 30;  // the minute passes in two seconds
@@ -62,25 +70,6 @@ TEST(SessionScreenTest, IdleTimeoutEndsTheSession) {
   ASSERT_TRUE(Settled(console, "Authentication Required"));
 }
 
-TEST(SessionScreenTest, Sigusr2DuringASessionExitsAfterLogout) {
-  TestConsole console(ConsoleOptions());
-  ASSERT_TRUE(LogIn(console));
-  ASSERT_TRUE(Settled(console, "System Customization"));
-  console.Signal(SIGUSR2);
-  console.Key("Down");
-  ASSERT_TRUE(console.WaitReady());
-  EXPECT_TRUE(console.Running());
-  EXPECT_TRUE(console.Contains("System Customization"));
-  console.Key("Esc");
-  EXPECT_EQ(console.WaitExit(), 0);
-  EXPECT_EQ(CountLog(console, "<14>User root logged out"), 1);
-  EXPECT_EQ(RecordsWhere(console, "audit.jsonl", "event", "tulk.logout").size(), 1u);
-}
-
-}  // namespace
-
-namespace {
-
 TEST(SessionScreenTest, KilledConsoleLeavesNoPamFolderBehind) {
   std::string marker;
   {
@@ -88,13 +77,13 @@ TEST(SessionScreenTest, KilledConsoleLeavesNoPamFolderBehind) {
     ASSERT_TRUE(LogIn(console));
     ASSERT_TRUE(Settled(console, "System Customization"));
     marker = console.Root().parent_path().string() + "/";
-    ASSERT_EQ(TulkTest::PamFoldersOf(marker).size(), 1u);
+    ASSERT_EQ(PamFoldersOf(marker).size(), 1u);
     console.Signal(SIGKILL);
     ASSERT_EQ(console.WaitExit(), 128 + SIGKILL);
     // Killed, pam_wrapper could not remove its folder itself.
-    EXPECT_EQ(TulkTest::PamFoldersOf(marker).size(), 1u);
+    EXPECT_EQ(PamFoldersOf(marker).size(), 1u);
   }
-  EXPECT_TRUE(TulkTest::PamFoldersOf(marker).empty());
+  EXPECT_TRUE(PamFoldersOf(marker).empty());
 }
 
 }  // namespace

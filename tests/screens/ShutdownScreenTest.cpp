@@ -3,25 +3,12 @@
 
 #include <algorithm>
 
-#include "SessionTestSupport.h"
+#include "ScreenTestSupport.h"
 
 namespace {
 
+using namespace TulkTest;
 using nlohmann::json;
-using SessionTest::CommandLines;
-using SessionTest::ConsoleOptions;
-using SessionTest::CountLog;
-using SessionTest::Gone;
-using SessionTest::LogIn;
-using SessionTest::RecordsWhere;
-using SessionTest::Settled;
-using SessionTest::WaitUntil;
-using TulkTest::TestConsole;
-
-bool Ran(const TestConsole& console, const std::string& line) {
-  const std::vector<std::string> commands = CommandLines(console);
-  return std::find(commands.begin(), commands.end(), line) != commands.end();
-}
 
 int CountRuns(const TestConsole& console, const std::string& name) {
   const std::vector<std::string> commands = CommandLines(console);
@@ -31,17 +18,19 @@ int CountRuns(const TestConsole& console, const std::string& name) {
 }
 
 ::testing::AssertionResult OpenShutdown(TestConsole& console) {
-  if (auto login = LogIn(console, "root", SessionTest::kRootPassword, "F12"); !login) {
+  if (auto login = LogIn(console, "root", kRootPassword, "F12"); !login) {
     return login;
   }
   return Settled(console, "[ ] Forcefully terminate running VMs, if any ...");
 }
 
 std::string Power(const TestConsole& console) {
-  return TulkTest::ReadHostState(console.HostStatePath()).value("power", "");
+  return ReadHostState(console.HostStatePath()).value("power", "");
 }
 
-TEST(ShutdownScreenTest, EscLeavesWithoutRunningAnything) {
+// Esc leaves without running anything; a shutdown then keeps the machines
+// graceful.
+TEST(ShutdownScreenTest, EscLeavesThenShutDownKeepsMachinesGraceful) {
   TestConsole console(ConsoleOptions());
   ASSERT_TRUE(OpenShutdown(console));
   EXPECT_TRUE(console.Contains("Remote management software is recommended to safely"));
@@ -57,16 +46,12 @@ TEST(ShutdownScreenTest, EscLeavesWithoutRunningAnything) {
   EXPECT_EQ(Power(console), "on");
   // Shutting down is not a session: no logout is recorded.
   EXPECT_TRUE(RecordsWhere(console, "audit.jsonl", "event", "tulk.logout").empty());
-}
 
-TEST(ShutdownScreenTest, ShutDownKeepsMachinesGracefulUnlessTicked) {
-  TestConsole console(ConsoleOptions());
   ASSERT_TRUE(OpenShutdown(console));
   console.Key("F2");
   ASSERT_TRUE(Settled(console, "Shutdown in progress..."));
   EXPECT_TRUE(console.Contains("Shut Down Host"));
-  ASSERT_TRUE(WaitUntil(
-      console, [&] { return Ran(console, "poweroff"); }, "poweroff"));
+  ASSERT_TRUE(console.WaitUntil([&] { return Ran(console, "poweroff"); }, "poweroff"));
   EXPECT_TRUE(Ran(console, "osk-cmd -U root hostsvc/autostartmanager/autostop"));
   EXPECT_TRUE(Ran(console, "powerOffVms"));
   EXPECT_FALSE(Ran(console, "powerOffVms --terminate"));
@@ -90,8 +75,7 @@ TEST(ShutdownScreenTest, RestartTerminatesMachinesWhenTicked) {
   console.Key("F11");
   ASSERT_TRUE(Settled(console, "Restart in progress..."));
   EXPECT_TRUE(console.Contains("Restart Host"));
-  ASSERT_TRUE(WaitUntil(
-      console, [&] { return Ran(console, "reboot"); }, "reboot"));
+  ASSERT_TRUE(console.WaitUntil([&] { return Ran(console, "reboot"); }, "reboot"));
   EXPECT_TRUE(Ran(console, "powerOffVms --terminate"));
   EXPECT_EQ(Power(console), "rebooting");
   EXPECT_EQ(CountLog(console, "<14>Rebooting host"), 1);
@@ -102,7 +86,7 @@ TEST(ShutdownScreenTest, RestartTerminatesMachinesWhenTicked) {
 
 TEST(ShutdownScreenTest, RestartThatCannotStartReturnsToTheDialog) {
   TulkTest::Options options = ConsoleOptions(
-      TulkTest::DemoHostState(), {},
+      DemoHostState(), {},
       [](const std::filesystem::path& root) { std::filesystem::remove(root / "bin/sh"); });
   TestConsole console(options);
   ASSERT_TRUE(OpenShutdown(console));
@@ -111,21 +95,20 @@ TEST(ShutdownScreenTest, RestartThatCannotStartReturnsToTheDialog) {
   ASSERT_TRUE(Gone(console, "Restart in progress..."));
   ASSERT_TRUE(Settled(console, "[ ] Forcefully terminate"));
   console.Key("F11");
-  ASSERT_TRUE(WaitUntil(
-      console, [&] { return CountRuns(console, "powerOffVms") == 2; }, "a second try"));
+  ASSERT_TRUE(
+      console.WaitUntil([&] { return CountRuns(console, "powerOffVms") == 2; }, "a second try"));
   ASSERT_TRUE(Settled(console, "[ ] Forcefully terminate"));
   EXPECT_EQ(CountLog(console, "<14>Rebooting host"), 2);
   EXPECT_EQ(Power(console), "on");
 }
 
 TEST(ShutdownScreenTest, RestartCommandThatFailsKeepsWaiting) {
-  json host = TulkTest::DemoHostState();
+  json host = DemoHostState();
   host["commands"]["reboot"] = {{"exitCode", 1}};
   TestConsole console(ConsoleOptions(host));
   ASSERT_TRUE(OpenShutdown(console));
   console.Key("F11");
-  ASSERT_TRUE(WaitUntil(
-      console, [&] { return Ran(console, "reboot"); }, "reboot"));
+  ASSERT_TRUE(console.WaitUntil([&] { return Ran(console, "reboot"); }, "reboot"));
   console.Key("Esc");
   ASSERT_TRUE(console.WaitReady());
   EXPECT_TRUE(console.Contains("Restart in progress..."));

@@ -4,17 +4,13 @@
 
 #include <signal.h>
 
-#include "SessionTestSupport.h"
+#include "ScreenTestSupport.h"
 #include "include/ColorNumbers.h"
 
 namespace {
 
+using namespace TulkTest;
 using nlohmann::json;
-using SessionTest::ConsoleOptions;
-using SessionTest::Gone;
-using SessionTest::Settled;
-using TulkTest::DemoHostState;
-using TulkTest::TestConsole;
 
 // Rows of the standard summary on 80 x 25.
 constexpr int kVersionRow = 5;
@@ -40,13 +36,15 @@ std::vector<json> Ipv6Networks(int count) {
   return networks;
 }
 
-TEST(WelcomeScreenTest, ShowsTheDemoHostInTwoPanels) {
-  TestConsole console(ConsoleOptions());
+// The demo host in two panels; F4 toggles monochrome and other keys
+// repaint; a reload whose version query fails keeps the last version line.
+TEST(WelcomeScreenTest, ShowsTheDemoHostTogglesMonochromeAndReloads) {
+  json host = DemoHostState();
+  TestConsole console(ConsoleOptions(host));
   ASSERT_TRUE(Settled(console, "To manage this host, go to:"));
 
-  EXPECT_EQ(SessionTest::Cells(console, kVersionRow, 8, 27), "Brimlo Tavi 8.1.0 (HyKernel");
-  EXPECT_EQ(SessionTest::Cells(console, kHardwareRow, 8, 36),
-            "Kestrel Computing KX2200 Rack Server");
+  EXPECT_EQ(Cells(console, kVersionRow, 8, 27), "Brimlo Tavi 8.1.0 (HyKernel");
+  EXPECT_EQ(Cells(console, kHardwareRow, 8, 36), "Kestrel Computing KX2200 Rack Server");
   EXPECT_NE(console.Row(kProcessorRow).find("2 x Helix H6-4316 16-Core Processor @ 2.30GHz"),
             std::string::npos);
   EXPECT_NE(console.Row(kMemoryRow).find("64 GiB Memory"), std::string::npos);
@@ -58,9 +56,9 @@ TEST(WelcomeScreenTest, ShowsTheDemoHostInTwoPanels) {
       "https://[2001:db8:20:30::41]/ (STATIC)",
       "https://[fe80::6b:4eff:fe10:2001]/"};
   for (std::size_t i = 0; i < addresses.size(); ++i) {
-    EXPECT_EQ(SessionTest::Cells(console, kAddressRow + static_cast<int>(i), 8,
-                                 static_cast<int>(addresses[i].size())),
-              addresses[i]);
+    EXPECT_EQ(
+        Cells(console, kAddressRow + static_cast<int>(i), 8, static_cast<int>(addresses[i].size())),
+        addresses[i]);
   }
   EXPECT_NE(console.Row(kFooterRow).find("<F2> Customize System/View Logs"), std::string::npos);
   EXPECT_NE(console.Row(kFooterRow).find("<F12> Shut Down/Restart "), std::string::npos);
@@ -73,11 +71,7 @@ TEST(WelcomeScreenTest, ShowsTheDemoHostInTwoPanels) {
   EXPECT_EQ(console.At(kFooterRow, legend).fg, Tulk::kDarkGrey);
   EXPECT_EQ(console.At(kFooterRow, 2).fg, Tulk::kBlack);
   EXPECT_EQ(console.At(0, 0).text, "┌");
-}
 
-TEST(WelcomeScreenTest, F4TogglesMonochromeAndOtherKeysRepaint) {
-  TestConsole console(ConsoleOptions());
-  ASSERT_TRUE(Settled(console, "To manage this host"));
   console.Key("F4");
   ASSERT_TRUE(console.WaitReady());
   EXPECT_TRUE(console.At(3, 40).reverse) << console.Dump();
@@ -95,9 +89,18 @@ TEST(WelcomeScreenTest, F4TogglesMonochromeAndOtherKeysRepaint) {
   // A full repaint: every cell is sent again.
   EXPECT_GT(console.BytesReceived() - before, 80u * 20u);
   EXPECT_TRUE(console.Contains("https://10.20.30.41/ (STATIC)"));
+
+  host["faults"]["HSI_Get"] = "version unreadable";
+  host["network"]["dns"]["hostname"] = "tavi-77";
+  ReplaceHostState(console, host);
+  console.Signal(SIGUSR1);
+  ASSERT_TRUE(Settled(console, "https://tavi-77/"));
+  EXPECT_EQ(Cells(console, kVersionRow, 8, 27), "Brimlo Tavi 8.1.0 (HyKernel");
 }
 
-TEST(WelcomeScreenTest, HardwareAndMemoryLinesOfAnotherHost) {
+// The hardware and memory lines of another host; after reloads, five IPv6
+// addresses are all listed and six are cut.
+TEST(WelcomeScreenTest, AnotherHostsHardwareAndIpv6Addresses) {
   json host = DemoHostState();
   host["hardware"]["vendor"] = " Acme  Inc. ";
   host["hardware"]["product"] = "Acme   Server 9";
@@ -106,43 +109,46 @@ TEST(WelcomeScreenTest, HardwareAndMemoryLinesOfAnotherHost) {
   host["hardware"]["memory"] = {{"totalPages", 393216}, {"pageSize", 4096}};
   TestConsole console(ConsoleOptions(host));
   ASSERT_TRUE(Settled(console, "1.5 GiB Memory"));
-  EXPECT_EQ(SessionTest::Cells(console, kHardwareRow, 8, 24), "Acme Inc. Acme Server 9 ");
-  EXPECT_EQ(SessionTest::Cells(console, kProcessorRow, 8, 10), "Helix H2  ");
-}
+  EXPECT_EQ(Cells(console, kHardwareRow, 8, 24), "Acme Inc. Acme Server 9 ");
+  EXPECT_EQ(Cells(console, kProcessorRow, 8, 10), "Helix H2  ");
 
-TEST(WelcomeScreenTest, FiveIpv6AddressesAreAllListedSixAreCut) {
   for (int count : {5, 6}) {
-    json host = DemoHostState();
+    host = DemoHostState();
     host["network"]["dns"]["hostname"] = "localhost";
     ManagementNic(host)["ipv4"] = {{"mode", "none"}};
     ManagementNic(host)["ipv6"]["networks"] = Ipv6Networks(count);
-    TestConsole console(ConsoleOptions(host));
+    ReplaceHostState(console, host);
+    console.Signal(SIGUSR1);
     ASSERT_TRUE(Settled(console, "https://[2001:db8:0:4::1]/ (STATIC)")) << count;
-    EXPECT_EQ(SessionTest::Cells(console, kAddressRow + 1, 8, 30), "https://[2001:db8:0:1::1]/ (ST")
+    ASSERT_TRUE(console.WaitUntil(
+        [&] { return console.Contains("https://[2001:db8:0:5::1]/") == (count == 5); },
+        "the fifth address"));
+    EXPECT_EQ(Cells(console, kAddressRow + 1, 8, 30), "https://[2001:db8:0:1::1]/ (ST")
         << "no host name or IPv4 line for localhost without IPv4";
     EXPECT_EQ(console.Contains("https://[2001:db8:0:5::1]/"), count == 5) << count;
-    EXPECT_EQ(SessionTest::Cells(console, kAddressRow + 5, 8, 3) == "...", count == 6) << count;
+    EXPECT_EQ(Cells(console, kAddressRow + 5, 8, 3) == "...", count == 6) << count;
     EXPECT_FALSE(console.Contains("https://[2001:db8:0:6::1]/"));
   }
 }
 
-TEST(WelcomeScreenTest, DhcpWithoutLeaseWaitsAndWarns) {
-  json host = DemoHostState();
-  ManagementNic(host)["ipv4"] = {{"mode", "dhcp"}};
-  ManagementNic(host)["dhcpLease"] = nullptr;
-  TestConsole console(ConsoleOptions(host));
-  ASSERT_TRUE(Settled(console, "https://0.0.0.0/ (Waiting for DHCP...)"));
-  EXPECT_EQ(SessionTest::Cells(console, kWarningRow, 16, 28), "Warning: DHCP lookup failed.");
-  EXPECT_EQ(console.At(kWarningRow, 16).fg, Tulk::kDarkGrey);
-}
-
-TEST(WelcomeScreenTest, AuditModeWarningReplacesTheDhcpWarning) {
-  json host = DemoHostState();
-  ManagementNic(host)["ipv4"] = {{"mode", "dhcp"}};
-  host["system"]["bootOption"] = 1;
-  TestConsole console(ConsoleOptions(host));
-  ASSERT_TRUE(Settled(console, "Warning: Host is running in audit mode."));
-  EXPECT_FALSE(console.Contains("DHCP lookup failed"));
+// DHCP without a lease waits and warns; the audit-mode warning replaces
+// the DHCP one.
+TEST(WelcomeScreenTest, DhcpAndAuditModeWarnings) {
+  for (const bool audit : {false, true}) {
+    SCOPED_TRACE(audit ? "audit mode" : "no lease");
+    json host = DemoHostState();
+    ManagementNic(host)["ipv4"] = {{"mode", "dhcp"}};
+    ManagementNic(host)["dhcpLease"] = nullptr;
+    host["system"]["bootOption"] = audit ? 1 : 0;
+    TestConsole console(ConsoleOptions(host));
+    ASSERT_TRUE(Settled(console, "https://0.0.0.0/ (Waiting for DHCP...)"));
+    EXPECT_EQ(console.Contains("Warning: Host is running in audit mode."), audit);
+    EXPECT_EQ(console.Contains("DHCP lookup failed"), !audit);
+    if (!audit) {
+      EXPECT_EQ(Cells(console, kWarningRow, 16, 28), "Warning: DHCP lookup failed.");
+      EXPECT_EQ(console.At(kWarningRow, 16).fg, Tulk::kDarkGrey);
+    }
+  }
 }
 
 TEST(WelcomeScreenTest, NoPhysicalNicRaisesTheAlertOnce) {
@@ -154,7 +160,7 @@ TEST(WelcomeScreenTest, NoPhysicalNicRaisesTheAlertOnce) {
   console.Type("x");
   console.Key("F4");
   ASSERT_TRUE(console.WaitReady());
-  const json alerts = TulkTest::ReadHostState(console.HostStatePath())["system"]["alerts"];
+  const json alerts = ReadHostState(console.HostStatePath())["system"]["alerts"];
   EXPECT_EQ(alerts, json::array({"No compatible network adapter found."}));
 }
 
@@ -163,14 +169,14 @@ TEST(WelcomeScreenTest, CustomMessageAndBackOnReload) {
   host["system"]["welcomeMessage"] = "Lab host of team {color:red}Blue{/color}\nCall 1234";
   TestConsole console(ConsoleOptions(host));
   ASSERT_TRUE(Settled(console, "Lab host of team Blue"));
-  EXPECT_EQ(SessionTest::Cells(console, 2, 0, 24), "│ Lab host of team Blue ");
+  EXPECT_EQ(Cells(console, 2, 0, 24), "│ Lab host of team Blue ");
   EXPECT_EQ(console.At(2, 19).fg, Tulk::kRed);
-  EXPECT_EQ(SessionTest::Cells(console, 3, 2, 9), "Call 1234");
+  EXPECT_EQ(Cells(console, 3, 2, 9), "Call 1234");
   EXPECT_FALSE(console.Contains("Customize System"));
 
   host["system"]["welcomeMessage"] = "";
   host["network"]["dns"]["hostname"] = "tavi-77";
-  TulkTest::ReplaceHostState(console, host);
+  ReplaceHostState(console, host);
   console.Signal(SIGUSR1);
   ASSERT_TRUE(Settled(console, "https://tavi-77/"));
   EXPECT_FALSE(console.Contains("Lab host"));
@@ -207,9 +213,9 @@ TEST(WelcomeScreenTest, FailingHostQueriesLeaveFillersOnTheScreen) {
   for (const auto& failure : failures) {
     EXPECT_TRUE(console.WaitForLog(failure.line));
   }
-  EXPECT_EQ(SessionTest::Cells(console, kHardwareRow, 8, 4), "N/A ");
-  EXPECT_EQ(SessionTest::Cells(console, kProcessorRow, 8, 4), "N/A ");
-  EXPECT_EQ(SessionTest::Cells(console, kMemoryRow, 8, 4), "N/A ");
+  EXPECT_EQ(Cells(console, kHardwareRow, 8, 4), "N/A ");
+  EXPECT_EQ(Cells(console, kProcessorRow, 8, 4), "N/A ");
+  EXPECT_EQ(Cells(console, kMemoryRow, 8, 4), "N/A ");
   EXPECT_TRUE(console.Contains("https://0.0.0.0/ (STATIC)")) << console.Dump();
   EXPECT_FALSE(console.Contains("audit mode")) << console.Dump();
   EXPECT_TRUE(console.Contains("<F2> Customize System/View Logs"));
@@ -218,19 +224,6 @@ TEST(WelcomeScreenTest, FailingHostQueriesLeaveFillersOnTheScreen) {
   }
   console.Key("F2");
   EXPECT_TRUE(Settled(console, "Authentication Required"));
-}
-
-// The version line keeps the last text it could build.
-TEST(WelcomeScreenTest, VersionLineOutlivesAFailingVersionQuery) {
-  json host = DemoHostState();
-  TestConsole console(ConsoleOptions(host));
-  ASSERT_TRUE(Settled(console, "To manage this host, go to:"));
-  host["faults"]["HSI_Get"] = "version unreadable";
-  host["network"]["dns"]["hostname"] = "tavi-77";
-  TulkTest::ReplaceHostState(console, host);
-  console.Signal(SIGUSR1);
-  ASSERT_TRUE(Settled(console, "https://tavi-77/"));
-  EXPECT_EQ(SessionTest::Cells(console, kVersionRow, 8, 27), "Brimlo Tavi 8.1.0 (HyKernel");
 }
 
 TEST(WelcomeScreenTest, LoginDisabledDialogClosesOnEnterOnly) {
@@ -253,7 +246,7 @@ TEST(WelcomeScreenTest, LoginDisabledDialogClosesOnEnterOnly) {
     ASSERT_TRUE(Gone(console, "Authentication Denied")) << open;
     EXPECT_TRUE(console.WaitForText("https://10.20.30.41/ (STATIC)"));
   }
-  EXPECT_TRUE(SessionTest::RecordsWhere(console, "audit.jsonl", "event", "tulk.login").empty());
+  EXPECT_TRUE(RecordsWhere(console, "audit.jsonl", "event", "tulk.login").empty());
   EXPECT_TRUE(console.Running());
 }
 

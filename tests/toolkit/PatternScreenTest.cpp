@@ -117,9 +117,9 @@ TEST(PatternScreen, F11QuestionIgnoresEnterAndFlipsItsCheckBoxWithSpace) {
 }
 
 TEST(PatternScreen, YesNoQuestionAnswersWithTheLettersOnly) {
+  TestConsole console(Scene("yesno"));
   for (const auto& [key, result] :
        {std::pair{"n", "result: 2"}, std::pair{"Y", "result: 1"}, std::pair{"Esc", "result: 0"}}) {
-    TestConsole console(Scene("yesno"));
     ASSERT_TRUE(console.WaitForText("Go ahead?"));
     console.Key("Enter");
     console.Type("x");
@@ -131,6 +131,7 @@ TEST(PatternScreen, YesNoQuestionAnswersWithTheLettersOnly) {
       console.Type(key);
     }
     EXPECT_TRUE(console.WaitForText(result)) << key;
+    console.Type("o");
   }
 }
 
@@ -151,12 +152,13 @@ struct ProgressScene {
   std::string fifo;
 };
 
-TEST(PatternScreen, WorkerResultWakesTheReportWhichClosesOnEnterOnly) {
+// The worker's result alone wakes the report, which closes on Enter only;
+// opened again, Esc ends the wait for the worker at once.
+TEST(PatternScreen, WorkerResultWakesTheReportAndEscEndsTheWait) {
   ProgressScene scene;
   TestConsole& console = scene.console;
   const std::string& fifo = scene.fifo;
   ASSERT_TRUE(FeedWorker(fifo, "0\n"));
-  // No key: the worker's result alone ends the wait.
   ASSERT_TRUE(console.WaitForText("Waiting for the worker. Done."));
   ASSERT_TRUE(console.WaitForText("<Enter> OK"));
   console.Key("Esc");
@@ -164,33 +166,14 @@ TEST(PatternScreen, WorkerResultWakesTheReportWhichClosesOnEnterOnly) {
   ASSERT_FALSE(console.Contains("result:"));
   console.Key("Enter");
   EXPECT_TRUE(console.WaitForText("result: 1"));
-}
 
-TEST(PatternScreen, EscEndsAWaitForAWorkerAtOnce) {
-  ProgressScene scene;
-  TestConsole& console = scene.console;
-  const std::string& fifo = scene.fifo;
+  console.Type("o");
+  ASSERT_TRUE(console.WaitForText("Waiting for the worker."));
   console.Key("Esc");
   EXPECT_TRUE(console.WaitForText("result: 0"));
   EXPECT_TRUE(FeedWorker(fifo, "1\n"));  // the worker ends after the dialog has gone
   console.Type("q");
   EXPECT_EQ(console.WaitExit(), 0);
-}
-
-TEST(PatternScreen, MenuRunsTheSelectedEntrysActionAndStartsAgainFromTheTop) {
-  TestConsole console(Scene("menu"));
-  ASSERT_TRUE(console.WaitForText("Description of Configure Password"));
-  console.Key("Down", 2);  // past the separator and the disabled entry
-  ASSERT_TRUE(console.WaitForText("Description of View System Logs"));
-  console.Key("Enter");
-  ASSERT_TRUE(console.WaitForText("Opened View System Logs"));
-  console.Key("Enter");
-  ASSERT_TRUE(console.WaitReady());
-  EXPECT_FALSE(console.Contains("Opened View System Logs"));
-  // The action asked to show the menu again: it starts from the first entry.
-  EXPECT_TRUE(console.Contains("Description of Configure Password"));
-  console.Key("Esc");
-  EXPECT_TRUE(console.WaitForText("result: 1"));
 }
 
 }  // namespace

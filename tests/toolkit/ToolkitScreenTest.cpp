@@ -45,45 +45,32 @@ std::string Cells(const TestConsole& console, int row, int col, int count) {
 }
 
 // Where a dialog's parts sit and their colours: WindowTest, on curses' own
-// screen. Here: the terminal shows them, and the key loop runs the dialog.
-TEST(ToolkitScreen, LowDialogShowsItsPartsAndEscCancels) {
+// screen. Here: the terminal shows them, the key loop runs the dialog, and
+// its owner is dimmed while it runs and restored after.
+TEST(ToolkitScreen, LowDialogShowsItsPartsDimsItsOwnerAndEndsByEscOrEnter) {
   TestConsole console(Scene("dialog"));
-  ASSERT_TRUE(console.WaitReady());
-  EXPECT_EQ(Cells(console, 9, 13, 11), "Demo Dialog");
-  EXPECT_EQ(Cells(console, 11, 13, 23), "Header text of the demo");
-  EXPECT_EQ(Cells(console, 15, 44, 25), "<Enter> OK  <Esc> Cancel ");
-  EXPECT_TRUE(HasColors(console, 11, 13, kDarkGrey, kLightGrey));  // header text
-  console.Key("Esc");
-  EXPECT_TRUE(console.WaitForText("result: 0"));
+  for (const char* key : {"Esc", "Enter"}) {
+    ASSERT_TRUE(console.WaitForText("Demo Dialog"));
+    ASSERT_TRUE(console.WaitReady());
+    EXPECT_EQ(Cells(console, 9, 13, 11), "Demo Dialog");
+    EXPECT_EQ(Cells(console, 11, 13, 23), "Header text of the demo");
+    EXPECT_EQ(Cells(console, 15, 44, 25), "<Enter> OK  <Esc> Cancel ");
+    EXPECT_TRUE(HasColors(console, 11, 13, kDarkGrey, kLightGrey));  // header text
+    EXPECT_TRUE(HasColors(console, 1, 2, kBlack, kDarkGrey));
+    EXPECT_TRUE(HasColors(console, 0, 0, kBlack, kDarkGrey));
+    console.Key(key);
+    ASSERT_TRUE(console.WaitForText(key == std::string("Esc") ? "result: 0" : "result: 1"));
+    ASSERT_TRUE(console.WaitReady());
+    EXPECT_TRUE(HasColors(console, 1, 2, kBlack, kWhite));
+    EXPECT_TRUE(HasColors(console, 0, 0, kBlack, kWhite));
+    EXPECT_FALSE(console.Contains("Demo Dialog"));
+    console.Type("o");
+  }
 }
 
-TEST(ToolkitScreen, OwnerIsDimmedWhileADialogRunsAndRestoredAfter) {
-  TestConsole console(Scene("dialog"));
-  ASSERT_TRUE(console.WaitForText("Demo Dialog"));
-  ASSERT_TRUE(console.WaitReady());
-  EXPECT_TRUE(HasColors(console, 1, 2, kBlack, kDarkGrey));
-  EXPECT_TRUE(HasColors(console, 0, 0, kBlack, kDarkGrey));
-  console.Key("Enter");
-  ASSERT_TRUE(console.WaitForText("result: 1"));
-  ASSERT_TRUE(console.WaitReady());
-  EXPECT_TRUE(HasColors(console, 1, 2, kBlack, kWhite));
-  EXPECT_TRUE(HasColors(console, 0, 0, kBlack, kWhite));
-  EXPECT_FALSE(console.Contains("Demo Dialog"));
-}
-
-TEST(ToolkitScreen, KeysTypedWhileADialogClosesAreDiscarded) {
-  TestConsole console(Scene("message"));
-  ASSERT_TRUE(console.WaitForText("Configure Password: Error"));
-  ASSERT_TRUE(console.WaitReady());
-  console.Send("\rxy");
-  ASSERT_TRUE(console.WaitReady());
-  EXPECT_TRUE(console.Contains("result: 1")) << console.Dump();
-  EXPECT_FALSE(console.Contains("key:")) << console.Dump();
-  console.Type("z");
-  EXPECT_TRUE(console.WaitForText("key: z"));
-}
-
-TEST(ToolkitScreen, MessageDialogIgnoresEscAndClosesWithEnter) {
+// A message dialog ignores Esc and closes with Enter; keys typed while it
+// closes are discarded.
+TEST(ToolkitScreen, MessageDialogClosesOnlyWithEnterAndDiscardsKeysTypedMeanwhile) {
   TestConsole console(Scene("message"));
   ASSERT_TRUE(console.WaitForText("The new password and the confirmed password do not"));
   console.Key("Esc");
@@ -91,8 +78,12 @@ TEST(ToolkitScreen, MessageDialogIgnoresEscAndClosesWithEnter) {
   ASSERT_TRUE(console.WaitReady());
   EXPECT_TRUE(console.Contains("Configure Password: Error"));
   EXPECT_FALSE(console.Contains("result:"));
-  console.Key("Enter");
-  EXPECT_TRUE(console.WaitForText("result: 1"));
+  console.Send("\rxy");
+  ASSERT_TRUE(console.WaitReady());
+  EXPECT_TRUE(console.Contains("result: 1")) << console.Dump();
+  EXPECT_FALSE(console.Contains("key:")) << console.Dump();
+  console.Type("z");
+  EXPECT_TRUE(console.WaitForText("key: z"));
 }
 
 TEST(ToolkitScreen, MonochromeDimsInStandoutAndShowsAnActiveBodyPlain) {
@@ -142,7 +133,7 @@ TEST(ToolkitScreen, IdleTimeoutPassesThroughTheOpenFrames) {
   EXPECT_TRUE(console.WaitForText("key: k"));
 }
 
-TEST(ToolkitScreen, RootWindowShowsPanesTitlesFootersAndTheVersionLine) {
+TEST(ToolkitScreen, RootWindowShowsItsPartsMovesOverDisabledEntriesAndRunsActions) {
   TestConsole console(Scene("menu"));
   ASSERT_TRUE(console.WaitReady());
   ASSERT_TRUE(console.WaitForLog("COLS=80, LINES=25"));
@@ -164,14 +155,8 @@ TEST(ToolkitScreen, RootWindowShowsPanesTitlesFootersAndTheVersionLine) {
   EXPECT_TRUE(HasColors(console, 4, 3, kBlack, kWhite));
   EXPECT_TRUE(HasColors(console, 5, 3, kYellow, kBlack));
   EXPECT_TRUE(HasColors(console, 7, 3, kYellow, kDarkGrey));
-}
 
-TEST(ToolkitScreen, MenuMovesOverDisabledEntriesWithFewBytesPerKey) {
-  Options options = Scene("menu");
-  options.keepOutput = true;
-  TestConsole console(options);
-  ASSERT_TRUE(console.WaitForText("Demo Menu"));
-  ASSERT_TRUE(console.WaitReady());
+  // Moves pass over disabled entries with few bytes a key.
   std::size_t before = console.BytesReceived();
   console.Key("Down");
   ASSERT_TRUE(console.WaitReady());
@@ -179,11 +164,20 @@ TEST(ToolkitScreen, MenuMovesOverDisabledEntriesWithFewBytesPerKey) {
   EXPECT_LT(console.BytesReceived() - before, 600u);
   // The next Down passes the separator and the disabled entry.
   console.Key("Down");
-  ASSERT_TRUE(console.WaitForText("Description of View System Logs"));
+  ASSERT_TRUE(console.WaitReady());
+  ASSERT_TRUE(console.Contains("Description of View System Logs")) << console.Dump();
   EXPECT_TRUE(HasColors(console, 8, 3, kBlack, kWhite));
   console.Key("Down");
   ASSERT_TRUE(console.WaitReady());
   EXPECT_TRUE(console.Contains("Description of View System Logs"));
+  // Enter runs the entry's action; as it asks to show the menu again, the
+  // menu starts from the first entry.
+  console.Key("Enter");
+  ASSERT_TRUE(console.WaitForText("Opened View System Logs"));
+  console.Key("Enter");
+  ASSERT_TRUE(console.WaitReady());
+  EXPECT_FALSE(console.Contains("Opened View System Logs"));
+  EXPECT_TRUE(console.Contains("Description of Configure Password"));
   console.Key("Esc");
   EXPECT_TRUE(console.WaitForText("result: 1"));
   // A normal end: every window freed (the sanitizer build checks for leaks).

@@ -9,14 +9,14 @@
 
 namespace {
 
-using namespace TroubleshootingTest;
+using namespace TulkTest;
 
 constexpr char kQuestion[] = "Restart management agents now?";
 constexpr char kCapture[] = "Collecting host agent live core information. Done.";
 constexpr char kStopping[] = "Stopping management agents.";
 
 TEST(RestartAgentsScreenTest, OnlyF11RestartsAndOnlyEnterCloses) {
-  TestConsole console(DriverOptions(TulkTest::DemoHostState(), "agents"));
+  TestConsole console(DriverOptions(DemoHostState(), "agents"));
   ASSERT_TRUE(Settled(console, kQuestion));
   EXPECT_EQ(ForegroundOf(console, "Warning! Restarting"), 1);  // red
   console.Key("Enter");
@@ -24,7 +24,7 @@ TEST(RestartAgentsScreenTest, OnlyF11RestartsAndOnlyEnterCloses) {
   ASSERT_TRUE(Settled(console, "[X] Collect extra troubleshooting information"));
   console.Key("Esc");
   ASSERT_TRUE(console.WaitForText("result: 0"));
-  EXPECT_EQ(ToolRuns(console), Lines{});
+  EXPECT_EQ(CommandLines(console), Lines{});
   EXPECT_EQ(LogLinesWith(console, "agents"), Lines{});
 
   console.Type("o");
@@ -34,20 +34,20 @@ TEST(RestartAgentsScreenTest, OnlyF11RestartsAndOnlyEnterCloses) {
   EXPECT_EQ(ForegroundOf(console, "Stopping management agents. Done."), 6);  // dark grey
   EXPECT_TRUE(console.Contains("Starting management agents. Done."));
   EXPECT_FALSE(console.Contains("Collecting"));
-  EXPECT_EQ(ToolRuns(console), (Lines{"services.sh stop", "services.sh start"}));
+  EXPECT_EQ(CommandLines(console), (Lines{"services.sh stop", "services.sh start"}));
   EXPECT_EQ(LogLinesWith(console, "agents"), Lines{"Restarting host agents"});
-  const auto events = TulkTest::SimRecords(console.Root(), "events.jsonl");
+  const auto events = SimRecords(console.Root(), "events.jsonl");
   ASSERT_EQ(events.size(), 1U);
   EXPECT_EQ(events[0]["id"], "qob.user.tulk.restarting.hostagents");
   console.Key("Esc");
   console.Key("F11");
   console.Key("Enter");
   EXPECT_TRUE(console.WaitForText("result: 1"));
-  EXPECT_EQ(ToolRuns(console).size(), 2U);
+  EXPECT_EQ(CommandLines(console).size(), 2U);
 }
 
 TEST(RestartAgentsScreenTest, CaptureIsDoneBeforeTheStopAndMayOutliveTheDialog) {
-  Json host = TulkTest::DemoHostState();
+  Json host = DemoHostState();
   host["commands"]["services.sh stop"] = {{"delayMs", 1500}};
   host["commands"]["hykbacktrace"] = {{"delayMs", 3000}};
   TestConsole console(DriverOptions(host, "agents"));
@@ -69,7 +69,7 @@ TEST(RestartAgentsScreenTest, CaptureIsDoneBeforeTheStopAndMayOutliveTheDialog) 
     cores += entry.path().filename().string().rfind("mgmtd-restart", 0) == 0 ? 1 : 0;
   }
   EXPECT_EQ(cores, 1);
-  EXPECT_EQ(ToolRuns(console, "hykbacktrace").back(),
+  EXPECT_EQ(CommandLines(console, "hykbacktrace").back(),
             "hykbacktrace -w -n mgmtd -o mgmtd-restart% -d /var/log/");
   console.Type("o");  // the console still answers
   EXPECT_TRUE(console.WaitForText(kQuestion));

@@ -4,11 +4,13 @@
 
 #include <gtest/gtest.h>
 
+#include <utility>
+
 #include "TroubleshootingTestSupport.h"
 
 namespace {
 
-using namespace TroubleshootingTest;
+using namespace TulkTest;
 
 constexpr char kTimeouts[] = "Modify Tavi Shell and SSH timeouts";
 constexpr int kDarkGrey = 6;
@@ -35,13 +37,21 @@ TEST(ServicesScreenTest, StatusScriptsChooseTheLabels) {
     const char* labels[2];
     bool timeoutsGreyed;
   } cases[] = {
-      {HostWithServices(false, false), {"Enable Tavi Shell", "Enable SSH"}, false},
       {HostWithServices(true, false), {"Disable Tavi Shell", "Enable SSH"}, true},
       {HostWithServices(false, true), {"Enable Tavi Shell", "Disable SSH"}, true},
       {notInstalled, {"Enable Tavi Shell", "Enable SSH"}, false},
   };
+  // One console: each case leaves the window, replaces the host and opens
+  // the window again.
+  TestConsole console(DriverOptions(cases[0].host, "troubleshooting"));
+  bool first = true;
   for (const auto& c : cases) {
-    TestConsole console(DriverOptions(c.host));
+    if (!std::exchange(first, false)) {
+      console.Key("Esc");
+      ASSERT_TRUE(Gone(console, "Restart Management Agents"));
+      ReplaceHostState(console, c.host);
+      console.Type("o");
+    }
     ASSERT_TRUE(Settled(console, "Restart Management Agents"));
     EXPECT_TRUE(console.Contains(c.labels[0]) && console.Contains(c.labels[1])) << console.Dump();
     EXPECT_EQ(TimeoutsGreyed(console), c.timeoutsGreyed) << c.labels[0] << c.labels[1];
@@ -49,8 +59,10 @@ TEST(ServicesScreenTest, StatusScriptsChooseTheLabels) {
 }
 
 TEST(ServicesScreenTest, TogglesFlipLabelsAndGreyTheTimeoutsWhileEitherRuns) {
-  TestConsole console(DriverOptions(HostWithServices(false, false)));
+  TestConsole console(DriverOptions(HostWithServices(false, false), "troubleshooting"));
   ASSERT_TRUE(Settled(console, "Restart Management Agents"));
+  EXPECT_TRUE(console.Contains("Enable Tavi Shell") && console.Contains("Enable SSH"));
+  EXPECT_FALSE(TimeoutsGreyed(console));
   EXPECT_EQ(ForegroundOf(console, "Tavi Shell is Disabled"), 7);
   const struct {
     const char* move;  // before Enter
@@ -72,7 +84,7 @@ TEST(ServicesScreenTest, TogglesFlipLabelsAndGreyTheTimeoutsWhileEitherRuns) {
   EXPECT_TRUE(console.Contains("SSH is Disabled"));  // the state line follows the flag
 
   const std::string osk = "osk-cmd -U root hostsvc/";
-  EXPECT_EQ(ToolRuns(console, "osk-cmd"),
+  EXPECT_EQ(CommandLines(console, "osk-cmd"),
             (Lines{osk + "start_tav_shell", osk + "enable_tav_shell", osk + "stop_tav_shell",
                    osk + "disable_tav_shell", osk + "start_ssh", osk + "enable_ssh",
                    osk + "start_tav_shell", osk + "enable_tav_shell", osk + "stop_tav_shell",
@@ -81,7 +93,7 @@ TEST(ServicesScreenTest, TogglesFlipLabelsAndGreyTheTimeoutsWhileEitherRuns) {
             (Lines{"User root enabled Tavi Shell", "User root disabled Tavi Shell",
                    "User root enabled SSH", "User root enabled Tavi Shell",
                    "User root disabled Tavi Shell", "User root disabled SSH"}));
-  EXPECT_TRUE(SelectTitle(console, kTimeouts));
+  EXPECT_TRUE(SelectEntry(console, kTimeouts));
 }
 
 TEST(ServicesScreenTest, FailingToolFallsBackToTheInitScriptAndSwitchesTheRuleset) {
@@ -104,14 +116,14 @@ TEST(ServicesScreenTest, FailingToolFallsBackToTheInitScriptAndSwitchesTheRulese
     if (c.fault != nullptr) {
       host["faults"]["FirewallRuleset::Enable"] = c.fault;
     }
-    TestConsole console(DriverOptions(host));
+    TestConsole console(DriverOptions(host, "troubleshooting"));
     ASSERT_TRUE(Settled(console, "Restart Management Agents"));
     console.Key("Down");
     console.Key("Enter");
     ASSERT_TRUE(Settled(console, "Disable SSH"));
-    EXPECT_EQ(ToolRuns(console, "SSH start"), Lines{"SSH start"});
-    EXPECT_EQ(ToolRuns(console, "osk-cmd").back(), "osk-cmd -U root hostsvc/enable_ssh");
-    const Json state = TulkTest::ReadHostState(console.HostStatePath());
+    EXPECT_EQ(CommandLines(console, "SSH start"), Lines{"SSH start"});
+    EXPECT_EQ(CommandLines(console, "osk-cmd").back(), "osk-cmd -U root hostsvc/enable_ssh");
+    const Json state = ReadHostState(console.HostStatePath());
     EXPECT_EQ(state["services"]["SSH"]["running"], true);
     EXPECT_EQ(state["system"]["firewall"]["sshServer"]["enabled"], c.rulesetOpen);
     Lines warnings = {"Unable to run osk-cmd to start/stop ssh"};
@@ -126,7 +138,7 @@ TEST(ServicesScreenTest, FlagAndLabelFlipEvenWhenEveryCommandFails) {
   Json host = HostWithServices(false, false);
   host["commands"]["osk-cmd"] = {{"exitCode", 1}};
   host["services"]["TavShell"]["installed"] = false;  // the init script fails too
-  TestConsole console(DriverOptions(host));
+  TestConsole console(DriverOptions(host, "troubleshooting"));
   ASSERT_TRUE(Settled(console, "Restart Management Agents"));
   console.Key("Enter");
   ASSERT_TRUE(Settled(console, "Disable Tavi Shell"));

@@ -4,12 +4,15 @@
 
 #include <gtest/gtest.h>
 
-#include "SessionTestSupport.h"
+#include <algorithm>
+#include <utility>
+
+#include "ScreenTestSupport.h"
 #include "TroubleshootingTestSupport.h"
 
 namespace {
 
-using namespace TroubleshootingTest;
+using namespace TulkTest;
 
 constexpr char kSet[] = "tavcli system settings advanced set -o /UserVars/";
 constexpr char kLimit[] = "Timeout value must be between 0 (disabled)";
@@ -31,8 +34,9 @@ Json HostWithTimeouts(int availability, int idle, int console, bool shellRunning
 }
 
 // Types `fields` into the fields in turn ("<BS>" empties one), presses
-// Enter, closes the limit messages and returns how many there were.
-int Submit(TestConsole& console, const std::vector<std::string>& fields) {
+// Enter, closes the limit messages and returns how many there were, once
+// the dialog titled `title` has closed.
+int Submit(TestConsole& console, const std::vector<std::string>& fields, const char* title) {
   for (std::size_t i = 0; i < fields.size(); ++i) {
     console.Key("Down", i > 0 ? 1 : 0);
     if (fields[i] == "<BS>") {
@@ -43,22 +47,38 @@ int Submit(TestConsole& console, const std::vector<std::string>& fields) {
   }
   console.Key("Enter");
   int messages = 0;
-  const auto next = [&] { return console.Contains(kLimit) || console.Contains("result: 1"); };
-  while (TulkTest::WaitUntil(console, next, "a message or the result") &&
-         console.Contains(kLimit)) {
+  const auto next = [&] { return console.Contains(kLimit) || !console.Contains(title); };
+  while (console.WaitUntil(next, "a message or the closed dialog") && console.Contains(kLimit)) {
     ++messages;
     console.Key("Enter");
     Gone(console, kLimit);
   }
+  Gone(console, title);
   return messages;
 }
 
-Lines Writes(const TestConsole& console) {
+// What the cases of one console did so far: the options written, the log
+// lines holding `logged` and the shell's restarts.
+struct Seen {
   Lines writes;
-  for (const std::string& run : ToolRuns(console, kSet)) {
-    writes.push_back(run.substr(sizeof kSet - 1));
+  Lines logged;
+  std::size_t shellRestarts = 0;
+};
+
+Seen SeenSoFar(const TestConsole& console, const std::string& logged) {
+  Seen seen;
+  for (const std::string& run : CommandLines(console, kSet)) {
+    seen.writes.push_back(run.substr(sizeof kSet - 1));
   }
-  return writes;
+  seen.logged = LogLinesWith(console, logged);
+  seen.shellRestarts = CommandLines(console, "TavShell restart").size();
+  return seen;
+}
+
+// The lines of `now` after the first `before` ones.
+Lines Since(const Lines& before, const Lines& now) {
+  return Lines(now.begin() + static_cast<std::ptrdiff_t>(std::min(before.size(), now.size())),
+               now.end());
 }
 
 TEST(TimeoutsScreenTest, ShellTimeoutsReachTheHost) {
@@ -100,17 +120,25 @@ TEST(TimeoutsScreenTest, ShellTimeoutsReachTheHost) {
        {"Modified Shell timeout to 1 minutes"},
        0},
   };
+  // One console: each case replaces the host and opens the dialog again.
+  TestConsole console(DriverOptions(cases[0].host, "shell-timeouts"));
+  bool first = true;
   for (const auto& c : cases) {
     SCOPED_TRACE(c.host["advancedOptions"].dump());
-    TestConsole console(DriverOptions(c.host, "shell-timeouts"));
+    if (!std::exchange(first, false)) {
+      ReplaceHostState(console, c.host);
+      console.Type("o");
+    }
+    const Seen before = SeenSoFar(console, "timeout");
     ASSERT_TRUE(Settled(console, "Availability timeout"));
-    EXPECT_EQ(Submit(console, c.typed), c.messages);
+    EXPECT_EQ(Submit(console, c.typed, "Availability timeout"), c.messages);
     ASSERT_TRUE(console.WaitForText("result: 1"));
-    EXPECT_EQ(Writes(console), c.writes);
-    EXPECT_EQ(LogLinesWith(console, "timeout"), c.logged);
-    EXPECT_EQ(ToolRuns(console, "TavShell restart").size(), c.shellRestarts);
-    EXPECT_EQ(ToolRuns(console, "SSH restart"), Lines{});
+    const Seen after = SeenSoFar(console, "timeout");
+    EXPECT_EQ(Since(before.writes, after.writes), c.writes);
+    EXPECT_EQ(Since(before.logged, after.logged), c.logged);
+    EXPECT_EQ(after.shellRestarts - before.shellRestarts, c.shellRestarts);
   }
+  EXPECT_EQ(CommandLines(console, "SSH restart"), Lines{});
 }
 
 TEST(TimeoutsScreenTest, ConsoleTimeoutComparesStoredSeconds) {
@@ -128,30 +156,38 @@ TEST(TimeoutsScreenTest, ConsoleTimeoutComparesStoredSeconds) {
       {600, "1441", "[ 10    ]", 1, {}, {}},
       {600, "<BS>", "[ 10    ]", 0, {}, {}},
   };
+  // One console: each case replaces the host and opens the dialog again.
+  TestConsole console(DriverOptions(HostWithTimeouts(0, 0, cases[0].stored), "tulk-timeout"));
+  bool first = true;
   for (const auto& c : cases) {
     SCOPED_TRACE(c.stored);
-    TestConsole console(DriverOptions(HostWithTimeouts(0, 0, c.stored), "tulk-timeout"));
+    if (!std::exchange(first, false)) {
+      ReplaceHostState(console, HostWithTimeouts(0, 0, c.stored));
+      console.Type("o");
+    }
+    const Seen before = SeenSoFar(console, "Tulk timeout");
     ASSERT_TRUE(Settled(console, "TULK idle timeout"));
     EXPECT_TRUE(console.Contains(c.shown)) << console.Dump();
-    EXPECT_EQ(Submit(console, {c.typed}), c.messages);
+    EXPECT_EQ(Submit(console, {c.typed}, "TULK idle timeout"), c.messages);
     ASSERT_TRUE(console.WaitForText("result: 1"));
-    EXPECT_EQ(Writes(console), c.writes);
-    EXPECT_EQ(LogLinesWith(console, "Tulk timeout"), c.logged);
+    const Seen after = SeenSoFar(console, "Tulk timeout");
+    EXPECT_EQ(Since(before.writes, after.writes), c.writes);
+    EXPECT_EQ(Since(before.logged, after.logged), c.logged);
   }
 }
 
 // Through the real console and its menus. The old timeout is a day; the
 // new minute ends the session without a new login.
 TEST(TimeoutsScreenTest, NewConsoleTimeoutEndsTheSessionItWasSetIn) {
-  TulkTest::Options options = SessionTest::ConsoleOptions(HostWithTimeouts(0, 0, 86400));
+  TulkTest::Options options = ConsoleOptions(HostWithTimeouts(0, 0, 86400));
   options.timeScale = 30;  // a console minute takes two seconds
   TestConsole console(options);
-  ASSERT_TRUE(SessionTest::LogIn(console));
+  ASSERT_TRUE(LogIn(console));
   ASSERT_TRUE(Settled(console, "System Customization"));
-  ASSERT_TRUE(SelectTitle(console, "Troubleshooting Options", 15));
+  ASSERT_TRUE(SelectEntry(console, "Troubleshooting Options"));
   console.Key("Enter");
   ASSERT_TRUE(Settled(console, "Troubleshooting Mode Options"));
-  ASSERT_TRUE(SelectTitle(console, "Modify TULK idle timeout"));
+  ASSERT_TRUE(SelectEntry(console, "Modify TULK idle timeout"));
   console.Key("Enter");
   ASSERT_TRUE(Settled(console, "[ 1440  ]"));
   console.Type("1");
