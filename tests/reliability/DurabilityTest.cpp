@@ -79,7 +79,7 @@ std::vector<Operation> Operations() {
          if (auto opened = Open(console, "Configure Password", "Old Password"); !opened) {
            return opened;
          }
-         console.Type(Reliability::kRootPassword);
+         console.Type(TulkTest::kRootPassword);
          console.Key("Down");
          console.Type("Another-pass-99");
          console.Key("Down");
@@ -93,7 +93,7 @@ std::vector<Operation> Operations() {
          return at == std::string::npos ? std::string("(no root)")
                                         : file.substr(at + 5, file.find(':', at + 5) - at - 5);
        },
-       Reliability::kRootPassword, "Another-pass-99"});
+       TulkTest::kRootPassword, "Another-pass-99"});
   operations.push_back(
       {"lockdown",
        [](TestConsole& console) {
@@ -186,7 +186,7 @@ std::vector<std::string> Temporaries(const std::filesystem::path& stateFile) {
 
 // A console on the shared root and state file of `home`.
 TulkTest::Options SharedOptions(const TestConsole& home) {
-  TulkTest::Options options = Reliability::ConsoleOptions(TulkTest::DemoHostState());
+  TulkTest::Options options = Reliability::ConsoleOptions();
   options.env["TULK_ROOT"] = home.Root().string();
   options.env["TULK_HOST_STATE"] = home.HostStatePath().string();
   options.term = "xterm";  // the keyboard entry is offered on terminals of that name
@@ -204,7 +204,7 @@ TEST(Durability, KillDuringEveryStateWriteLosesNothing) {
   for (const Operation& operation : operations) {
     SCOPED_TRACE(operation.name);
     // One root and state file for all runs of the operation.
-    TulkTest::Options homeOptions = Reliability::ConsoleOptions(TulkTest::DemoHostState());
+    TulkTest::Options homeOptions = Reliability::ConsoleOptions();
     homeOptions.start = false;
     TestConsole home(homeOptions);
     TulkTest::WriteRootFile(home.Root(), "/var/run/brimlo/show-tulk-login");

@@ -82,12 +82,11 @@ TEST(HostileValues, HostNameNicsVendorAndLogNeverReachTheTerminalRaw) {
   host["hardware"]["vendor"] = "Vendor" + hostile;
   host["network"]["pnics"][3]["name"] = "hynic3" + hostile;
   host["network"]["pnics"][2]["pci"]["description"] = "Adapter" + hostile;
-  TulkTest::Options options = Reliability::ConsoleOptions(host);
+  TulkTest::Options options =
+      TulkTest::ConsoleOptions(host, {}, [&](const std::filesystem::path& root) {
+        TulkTest::WriteRootFile(root, "/var/log/syslog.log", "log line" + hostile + "\n");
+      });
   options.keepOutput = true;
-  options.prepareRoot = [&](const std::filesystem::path& root) {
-    TulkTest::WriteRootFile(root, "/var/run/brimlo/show-tulk-login");
-    TulkTest::WriteRootFile(root, "/var/log/syslog.log", "log line" + hostile + "\n");
-  };
   TestConsole console(options);
   ASSERT_TRUE(console.WaitReady());
   EXPECT_TRUE(Clean(console, "on the welcome screen"));
@@ -109,7 +108,7 @@ TEST(HostileValues, HostNameNicsVendorAndLogNeverReachTheTerminalRaw) {
   EXPECT_TRUE(Clean(console, "in the network screens"));
 
   ASSERT_TRUE(TulkTest::Settled(console, "System Customization"));
-  ASSERT_TRUE(Reliability::SelectEntry(console, "View System Logs"));
+  ASSERT_TRUE(TulkTest::SelectEntry(console, "View System Logs"));
   console.Type("1");
   ASSERT_TRUE(console.WaitForText("log line"));
   console.SendNow("q");

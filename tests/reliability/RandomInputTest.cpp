@@ -6,8 +6,8 @@
 // simulated host ends it, for one), and its memory must stay flat.
 //
 // The log pager is a program of its own in front of the console: when a
-// burst left it running, the pager is interrupted and quit (Ctrl-C, "q")
-// as an operator would, and the console must answer again.
+// burst left it running, it is quit ("q", Ctrl-C) as an operator would,
+// and the console must answer again.
 
 #include <dirent.h>
 #include <gtest/gtest.h>
@@ -104,7 +104,7 @@ class RandomInput {
 
   // Starts a fresh console and brings it to the place.
   ::testing::AssertionResult Arrive() {
-    console_ = std::make_unique<TestConsole>(Options());
+    console_ = std::make_unique<TestConsole>(Reliability::ConsoleOptions());
     if (place_ == "welcome") {
       return TulkTest::Settled(*console_, Reliability::kWelcomeText);
     }
@@ -156,21 +156,14 @@ class RandomInput {
   }
 
  private:
-  TulkTest::Options Options() const {
-    TulkTest::Options options = Reliability::ConsoleOptions(TulkTest::DemoHostState());
-    options.prepareRoot = [](const std::filesystem::path& root) {
-      TulkTest::WriteRootFile(root, "/var/run/brimlo/show-tulk-login");
-      TulkTest::WriteRootFile(root, "/var/log/syslog.log", "a line of the host log\n");
-    };
-    return options;
-  }
-
   // Waits for the console's answer to `burst`; quits a pager the burst left
   // running; restarts a console that ended in a documented way.
   void Answered(std::chrono::steady_clock::time_point start, const std::string& burst) {
     for (int attempt = 0; attempt < 20; ++attempt) {
       if (console_->WaitReady(kAnswer)) {
-        figures_.slowest = std::max(figures_.slowest, console_->ReadyAt() - start);
+        if (attempt == 0) {  // not the time a pager stood in front of it
+          figures_.slowest = std::max(figures_.slowest, console_->ReadyAt() - start);
+        }
         return;
       }
       if (!console_->Running()) {
@@ -184,8 +177,11 @@ class RandomInput {
         return;
       }
       if (PagerOf(console_->Pid()) != 0) {
-        ++figures_.pagerVisits;
-        console_->SendNow("\x03q");
+        // "q" quits the pager at its prompt; Ctrl-C first leaves whatever
+        // the keys started (a search, following the file). The pager drops
+        // what was typed ahead of an interrupt: the two go separately.
+        figures_.pagerVisits += attempt == 0 ? 1 : 0;
+        console_->SendNow(attempt % 2 == 0 ? "q" : "\x03");
         continue;
       }
       FAIL() << "no answer within " << std::chrono::duration<double>(kAnswer).count()
@@ -236,7 +232,7 @@ class RandomInput {
 TEST(RandomInput, EveryScreenAnswersEveryKeyAndKeepsItsMemory) {
   std::vector<std::string> places = {"welcome", "login"};
   {
-    TestConsole console(Reliability::ConsoleOptions(TulkTest::DemoHostState()));
+    TestConsole console(Reliability::ConsoleOptions());
     ASSERT_TRUE(Reliability::LogIn(console));
     for (const std::string& title : Reliability::EntryTitles(console)) {
       places.push_back(title);

@@ -13,59 +13,24 @@
 #include <fstream>
 
 #include "KeyNames.h"
-#include "ScreenTestSupport.h"
 
 namespace Reliability {
 
 TulkTest::Options ConsoleOptions(const nlohmann::json& host) {
-  TulkTest::Options options;
-  options.hostState = host.dump();
-  options.pamUsers = {{"root", kRootPassword}};
-  options.prepareRoot = [](const std::filesystem::path& root) {
-    TulkTest::WriteRootFile(root, "/var/run/brimlo/show-tulk-login");
-  };
-  return options;
+  return TulkTest::ConsoleOptions(host, {}, [](const std::filesystem::path& root) {
+    TulkTest::WriteRootFile(root, "/var/log/syslog.log", std::string(kLogLine) + "\n");
+  });
 }
 
 ::testing::AssertionResult LogIn(TulkTest::TestConsole& console) {
-  if (auto welcome = TulkTest::Settled(console, kWelcomeText); !welcome) {
-    return welcome;
+  if (auto entered = TulkTest::LogIn(console); !entered) {
+    return entered;
   }
-  console.Key("F2");
-  if (auto shown = TulkTest::Settled(console, "Authentication Required"); !shown) {
-    return shown;
-  }
-  // On a local console the dialog starts on the keyboard label above the
-  // login name.
-  console.Key("Down", console.Contains("Configured Keyboard") ? 2 : 1);
-  console.Type(kRootPassword);
-  console.Key("Enter");
   return TulkTest::Settled(console, "System Customization");
 }
 
-std::string RightTitle(const TulkTest::TestConsole& console) {
-  std::string text;
-  for (int col = 42; col < 79; ++col) {
-    text += console.At(1, col).text;
-  }
-  return text.substr(0, text.find_last_not_of(' ') + 1);
-}
-
-::testing::AssertionResult SelectEntry(TulkTest::TestConsole& console, const std::string& title) {
-  for (int step = 0; step < 30; ++step) {
-    if (RightTitle(console) == title) {
-      return ::testing::AssertionSuccess();
-    }
-    console.Key("Down");
-    if (auto ready = console.WaitReady(); !ready) {
-      return ready;
-    }
-  }
-  return ::testing::AssertionFailure() << "no menu entry \"" << title << "\"\n" << console.Dump();
-}
-
 ::testing::AssertionResult OpenEntry(TulkTest::TestConsole& console, const std::string& title) {
-  if (auto selected = SelectEntry(console, title); !selected) {
+  if (auto selected = TulkTest::SelectEntry(console, title); !selected) {
     return selected;
   }
   console.Key("Enter");
@@ -75,7 +40,7 @@ std::string RightTitle(const TulkTest::TestConsole& console) {
 std::vector<std::string> EntryTitles(TulkTest::TestConsole& console) {
   std::vector<std::string> titles;
   for (int step = 0; step < 30; ++step) {
-    std::string title = RightTitle(console);
+    std::string title = TulkTest::RightTitle(console);
     if (std::find(titles.begin(), titles.end(), title) != titles.end()) {
       break;  // the last entry: Down no longer moves, or wrapped round
     }

@@ -17,36 +17,32 @@
 
 #include <nlohmann/json.hpp>
 
+#include "ScreenTestSupport.h"
 #include "TestConsole.h"
 
 namespace Reliability {
 
-/// The password of the demo's root user.
-inline constexpr char kRootPassword[] = "tulk";
 /// The welcome screen's footer: shown only on the welcome screen.
 inline constexpr char kWelcomeText[] = "Customize System/View Logs";
 
-/// Options for a console on `host` with the demo users and the marker that
-/// offers the login.
-TulkTest::Options ConsoleOptions(const nlohmann::json& host);
+/// Options of the real console on `host` (with the demo users and the
+/// login marker) whose root also holds a one-line "/var/log/syslog.log".
+TulkTest::Options ConsoleOptions(const nlohmann::json& host = TulkTest::DemoHostState());
 
-/// Opens the login from the settled welcome screen and logs in as root;
-/// succeeds once the System Customization menu has settled.
+/// Logs in as root from the settled welcome screen; succeeds once the
+/// System Customization menu has settled.
 ::testing::AssertionResult LogIn(TulkTest::TestConsole& console);
 
-/// From the settled menu (or the network window): moves to the entry
-/// titled `title`.
-::testing::AssertionResult SelectEntry(TulkTest::TestConsole& console, const std::string& title);
-
-/// SelectEntry(), then Enter (without waiting for what it opens).
+/// Selects the full-screen menu's entry `title` and presses Enter (without
+/// waiting for what it opens).
 ::testing::AssertionResult OpenEntry(TulkTest::TestConsole& console, const std::string& title);
 
 /// The menu's entry titles, top to bottom, read by walking the settled
 /// menu; the selection is back on the first entry afterwards.
 std::vector<std::string> EntryTitles(TulkTest::TestConsole& console);
 
-/// The right pane's title (row 1 of an 80-column menu), trimmed.
-std::string RightTitle(const TulkTest::TestConsole& console);
+/// The line of the root's "/var/log/syslog.log".
+inline constexpr char kLogLine[] = "a line of the host log";
 
 /// Resident memory of a process in KiB (0 when it cannot be read).
 long ResidentKiB(pid_t pid);

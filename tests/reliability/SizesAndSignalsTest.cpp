@@ -23,7 +23,7 @@ const std::vector<std::pair<int, int>> kSizes = {{1, 1}, {20, 5}, {40, 12}, {80,
 TEST(Sizes, EverySizeAtStartAnswersKeysAndEndsCleanly) {
   for (const auto& [cols, rows] : kSizes) {
     SCOPED_TRACE(std::to_string(cols) + "x" + std::to_string(rows));
-    TulkTest::Options options = Reliability::ConsoleOptions(TulkTest::DemoHostState());
+    TulkTest::Options options = Reliability::ConsoleOptions();
     options.cols = cols;
     options.rows = rows;
     TestConsole console(options);
@@ -46,7 +46,7 @@ TEST(Sizes, EverySizeAtStartAnswersKeysAndEndsCleanly) {
 TEST(Sizes, ResizeToEverySizeInADialogEndsCleanly) {
   for (const auto& [cols, rows] : kSizes) {
     SCOPED_TRACE(std::to_string(cols) + "x" + std::to_string(rows));
-    TestConsole console(Reliability::ConsoleOptions(TulkTest::DemoHostState()));
+    TestConsole console(Reliability::ConsoleOptions());
     ASSERT_TRUE(Reliability::LogIn(console));
     ASSERT_TRUE(Reliability::OpenEntry(console, "Configure Password"));
     ASSERT_TRUE(console.WaitReady());
@@ -92,22 +92,15 @@ const std::map<Place, std::string> kPlaceNames = {
       if (auto menu = Reliability::LogIn(console); !menu) {
         return menu;
       }
-      if (auto opened = Reliability::SelectEntry(console, "View System Logs"); !opened) {
+      if (auto opened = TulkTest::SelectEntry(console, "View System Logs"); !opened) {
         return opened;
       }
       console.Type("1");
-      return console.WaitForText("a line of the host log");
+      return console.WaitForText(Reliability::kLogLine);
     case Place::kCommand: {
-      if (auto welcome = TulkTest::Settled(console, Reliability::kWelcomeText); !welcome) {
-        return welcome;
+      if (auto entered = TulkTest::LogIn(console); !entered) {
+        return entered;
       }
-      console.Key("F2");
-      if (auto shown = TulkTest::Settled(console, "Authentication Required"); !shown) {
-        return shown;
-      }
-      console.Key("Down");
-      console.Type(Reliability::kRootPassword);
-      console.Key("Enter");
       // The menu's first host query hangs: wait until the tool has started.
       return console.WaitUntil(
           [&] {
@@ -161,10 +154,6 @@ TEST(Signals, EverySignalInEveryPlace) {
       }
       TulkTest::Options options = Reliability::ConsoleOptions(host);
       options.env["TULK_COMMAND_TIME_SCALE"] = "10";
-      options.prepareRoot = [](const std::filesystem::path& root) {
-        TulkTest::WriteRootFile(root, "/var/run/brimlo/show-tulk-login");
-        TulkTest::WriteRootFile(root, "/var/log/syslog.log", "a line of the host log\n");
-      };
       TestConsole console(options);
       ASSERT_TRUE(Reach(console, place));
       // Straight to the process: in the pager and in a command the console
@@ -173,7 +162,7 @@ TEST(Signals, EverySignalInEveryPlace) {
       ++cases;
       if (Ends(signal, place)) {
         EXPECT_EQ(console.WaitExit(), 0);
-        EXPECT_TRUE(Reliability::TerminalGivenBack(console, "a line of the host log"));
+        EXPECT_TRUE(Reliability::TerminalGivenBack(console, Reliability::kLogLine));
         continue;
       }
       // It goes on: it answers again (after the pager is quit), and ends

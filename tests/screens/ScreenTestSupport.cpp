@@ -56,6 +56,9 @@ Options DriverOptions(const Json& host, const std::string& scene) {
   if (auto shown = Settled(console, "Authentication Required"); !shown) {
     return shown;
   }
+  if (console.Contains("Configured Keyboard")) {
+    console.Key("Down");  // a local console's dialog starts on the keyboard label
+  }
   if (user != "root") {
     console.Type(user);
   }

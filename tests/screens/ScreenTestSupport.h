@@ -66,8 +66,9 @@ Options DriverOptions(const Json& host = DemoHostState(), const std::string& sce
 // ---- common steps ---------------------------------------------------------
 
 /// Waits for the settled welcome screen, opens the login with `key` ("F2"
-/// or "F12"), enters `user` (replacing the pre-filled "root" unless it is
-/// root) and `password`, and presses Enter.
+/// or "F12"), moves past the keyboard label when the dialog shows one,
+/// enters `user` (replacing the pre-filled "root" unless it is root) and
+/// `password`, and presses Enter.
 ::testing::AssertionResult LogIn(TestConsole& console, const std::string& user = "root",
                                  const std::string& password = kRootPassword,
                                  const std::string& key = "F2");
