@@ -79,7 +79,7 @@ void TakeTerminalBack(const termios* consoleAttributes) {
       (void)putp(cursor_normal);
     }
     (void)putp(enter_ca_mode);
-    std::fflush(stdout);
+    (void)std::fflush(stdout);
   }
   const bool visible = Window::CursorVisible();
   curs_set(visible ? 0 : 1);
