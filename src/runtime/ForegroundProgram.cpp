@@ -27,6 +27,7 @@ constexpr int kGraceMilliseconds = 1000;
 constexpr int kTerminateCode = 4;
 constexpr int kReloadCode = 1;
 constexpr int kExitAfterCode = 2;
+constexpr int kResizeCode = 3;
 
 // A background process group may only take the terminal with SIGTTOU
 // blocked; otherwise the call stops the whole console.
@@ -156,6 +157,9 @@ class ForegroundWait {
     if (exitAfter_) {
       ForwardSignal(SIGUSR2);
     }
+    if (resized_) {
+      ForwardSignal(SIGWINCH);
+    }
   }
 
  private:
@@ -206,7 +210,10 @@ class ForegroundWait {
       case kExitAfterCode:
         exitAfter_ = true;
         break;
-      default:  // a resize is noticed when the program has ended
+      case kResizeCode:  // acted on, as in the key loop, once the program has ended
+        resized_ = true;
+        break;
+      default:
         break;
     }
   }
@@ -219,6 +226,7 @@ class ForegroundWait {
   timespec lastInput_{};
   bool reload_ = false;
   bool exitAfter_ = false;
+  bool resized_ = false;
 };
 
 }  // namespace

@@ -9,8 +9,10 @@
 /// - SIGINT, SIGQUIT, SIGTERM, SIGHUP and SIGPIPE end the program (SIGTERM
 ///   to its process group, SIGKILL when it has not gone after a second),
 ///   then the console as everywhere else (exit 0);
-/// - SIGUSR1 and SIGUSR2 are handed back to the signal pipe and acted on
-///   by the next key wait;
+/// - SIGUSR1, SIGUSR2 and SIGWINCH are handed back to the signal pipe and
+///   acted on by the next key wait (a SIGWINCH then ends the console as a
+///   resize does, whether or not the size changed; a real resize reaches
+///   only the program, and ExitIfResizedMeanwhile() notices it);
 /// - a program stopped from the outside is continued: the console has no
 ///   shell to return to;
 /// - with the idle timeout active, the session's deadline keeps running as
