@@ -1,6 +1,8 @@
 // The layout pass with arbitrary text and widths 1 to 300. The first two
 // bytes choose the width, the rest is the text. Besides not crashing, no
-// laid-out line may be wider than the width.
+// laid-out line may be wider than the width. The same text made safe for
+// the terminal must be safe, stay as it is when made safe again, and hold
+// no control character.
 
 #include <cstddef>
 #include <cstdint>
@@ -9,6 +11,7 @@
 #include <string_view>
 
 #include "render/MarkupLayout.h"
+#include "render/TerminalText.h"
 
 namespace {
 
@@ -58,6 +61,16 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
   std::string laidOut = Tulk::LayOutMarkup(text, width, Variables);
   if (WidestLine(laidOut) > static_cast<std::size_t>(width)) {
     std::abort();
+  }
+  const std::string safe = Tulk::TerminalSafe(text);
+  if (!Tulk::IsTerminalSafe(safe) || Tulk::TerminalSafe(safe) != safe ||
+      Tulk::IsTerminalSafe(text) != (safe == text)) {
+    std::abort();
+  }
+  for (char c : safe) {
+    if (static_cast<unsigned char>(c) < 0x20 || c == 0x7F) {
+      std::abort();
+    }
   }
   return 0;
 }
