@@ -1,6 +1,8 @@
 #!/usr/bin/env bash
 # Installs what is missing, builds, and runs the whole test suite:
-#   1. default build (warnings as errors): unit and screen tests, then
+#   1. default build (warnings as errors): unit and screen tests, the
+#      reliability suite one test at a time (where answer times and memory
+#      growth are measured), then
 #      clang-format and clang-tidy on the sources (scripts/check-sources.sh),
 #      then the installation: staged install, systemd units verified and
 #      rated, manual page (scripts/check-deploy.sh), and the console under
@@ -80,6 +82,10 @@ scripts/check-layers.sh
 echo "== default build: unit and screen tests"
 scripts/build.sh default
 run_ctest --preset default -j "$jobs"
+if ((run_reliability)); then
+  echo "== reliability suite (default build, one test at a time)"
+  run_ctest --preset reliability
+fi
 scripts/check-sources.sh "${check_options[@]}"
 echo "== installation: staged install, systemd units, manual page"
 scripts/check-deploy.sh build/default
