@@ -19,11 +19,10 @@
 #include <string_view>
 #include <utility>
 
+#include "runtime/ChildProcess.h"
 #include "runtime/HostPath.h"
 #include "runtime/ScreenFlush.h"
 #include "runtime/SystemLog.h"
-
-extern char** environ;
 
 namespace Tulk {
 namespace {
@@ -162,51 +161,6 @@ std::string ResolveProgram(const std::string& program) {
   return program;
 }
 
-std::string_view VariableName(std::string_view entry) {
-  return entry.substr(0, entry.find('='));
-}
-
-bool HasVariable(const std::vector<std::string>& environment, std::string_view name) {
-  return std::any_of(environment.begin(), environment.end(),
-                     [name](const std::string& entry) { return VariableName(entry) == name; });
-}
-
-std::vector<std::string> ChildEnvironment(const std::vector<std::string>* given) {
-  std::vector<std::string> environment;
-  if (given != nullptr) {
-    environment = *given;
-  } else {
-    for (char** entry = environ; entry != nullptr && *entry != nullptr; ++entry) {
-      environment.emplace_back(*entry);
-    }
-  }
-  if (!HostRootConfined()) {
-    return environment;
-  }
-  if (given != nullptr) {
-    for (char** entry = environ; entry != nullptr && *entry != nullptr; ++entry) {
-      std::string_view name = VariableName(*entry);
-      if (name.starts_with("TULK_") && !HasVariable(environment, name)) {
-        environment.emplace_back(*entry);
-      }
-    }
-  }
-  std::erase_if(environment,
-                [](const std::string& entry) { return VariableName(entry) == "PATH"; });
-  environment.push_back("PATH=" + ProgramSearchPath());
-  return environment;
-}
-
-std::vector<char*> PointerVector(std::vector<std::string>& strings) {
-  std::vector<char*> pointers;
-  pointers.reserve(strings.size() + 1);
-  for (std::string& text : strings) {
-    pointers.push_back(text.data());
-  }
-  pointers.push_back(nullptr);
-  return pointers;
-}
-
 // One optional capture: the caller's buffer, its capacity and the pipe.
 struct Capture {
   Capture(char* callerBuffer, std::int32_t* callerLength)
@@ -262,8 +216,8 @@ std::optional<pid_t> Spawn(const std::string& program, const std::vector<std::st
     argumentCopy.push_back(program);
   }
   std::vector<std::string> environmentCopy = ChildEnvironment(environment);
-  std::vector<char*> argv = PointerVector(argumentCopy);
-  std::vector<char*> envp = PointerVector(environmentCopy);
+  std::vector<char*> argv = ExecVector(argumentCopy);
+  std::vector<char*> envp = ExecVector(environmentCopy);
 
   pid_t pid = -1;
   int rc =

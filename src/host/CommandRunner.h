@@ -15,11 +15,12 @@
 /// - The child starts with an empty signal mask and default signal
 ///   dispositions (the console blocks six signals in every thread), and
 ///   inherits no descriptor beyond 0 to 2.
-/// - With a confined root (TULK_ROOT not "/") the child's PATH is always
-///   ProgramSearchPath(), also in an environment the caller gives; a given
-///   environment is then completed with the process's TULK_* variables that
-///   it does not set itself, so that simulated host tools see the same root,
-///   host state and log copy as the console.
+/// - The child's environment is ChildEnvironment() (runtime/ChildProcess.h):
+///   with a confined root (TULK_ROOT not "/") its PATH is always
+///   ProgramSearchPath(), also in an environment the caller gives, and a
+///   given environment is completed with the process's TULK_* variables, so
+///   that simulated host tools see the same root, host state and log copy
+///   as the console.
 ///
 /// - The child runs in a process group of its own: a command killed by its
 ///   time limit takes every process it started with it (the programs of a

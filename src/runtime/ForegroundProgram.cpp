@@ -14,6 +14,7 @@
 #include <cstdlib>
 #include <initializer_list>
 
+#include "runtime/ChildProcess.h"
 #include "runtime/Clock.h"
 #include "runtime/KeyInput.h"
 #include "runtime/SignalThread.h"
@@ -42,16 +43,6 @@ void GiveTerminalTo(pid_t group) {
   pthread_sigmask(SIG_BLOCK, &ttou, &saved);
   tcsetpgrp(kTerminal, group);
   pthread_sigmask(SIG_SETMASK, &saved, nullptr);
-}
-
-std::vector<char*> Pointers(std::vector<std::string>& strings) {
-  std::vector<char*> pointers;
-  pointers.reserve(strings.size() + 1);
-  for (std::string& text : strings) {
-    pointers.push_back(text.data());
-  }
-  pointers.push_back(nullptr);
-  return pointers;
 }
 
 // Only async-signal-safe calls between fork and exec: the console has
@@ -235,8 +226,8 @@ ForegroundEnd RunInForeground(const std::string& program, const std::vector<std:
                               const std::vector<std::string>& environment, bool idleTimeout) {
   std::vector<std::string> argumentCopy = arguments;
   std::vector<std::string> environmentCopy = environment;
-  std::vector<char*> argv = Pointers(argumentCopy);
-  std::vector<char*> envp = Pointers(environmentCopy);
+  std::vector<char*> argv = ExecVector(argumentCopy);
+  std::vector<char*> envp = ExecVector(environmentCopy);
 
   const pid_t pid = fork();
   if (pid == 0) {

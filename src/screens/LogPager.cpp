@@ -8,9 +8,9 @@
 #include <unistd.h>
 
 #include <cstdio>
-#include <cstring>
 
 #include "include/ProcessFlags.h"
+#include "runtime/ChildProcess.h"
 #include "runtime/ForegroundProgram.h"
 #include "runtime/HostPath.h"
 #include "runtime/KeyInput.h"
@@ -20,30 +20,20 @@
 #include "screens/EnvironmentOverride.h"
 #include "toolkit/Window.h"
 
-extern char** environ;
-
 namespace Tulk {
 namespace {
 
 constexpr char kPager[] = "/bin/less";
 constexpr char kPrompt[] = "<Q> Quit </> RegExp Search <H> Help";
 
-// The console's environment without PATH (when confined) and without the
+// The environment of every child (runtime/ChildProcess.h) without the
 // pager's own variables but LESSSECURE; then LESSHISTFILE=- and
 // LESSCHARSET=ascii.
-std::vector<std::string> ChildEnvironment() {
-  std::vector<std::string> entries;
-  for (char** entry = environ; *entry != nullptr; ++entry) {
-    const bool path = std::strncmp(*entry, "PATH=", 5) == 0;
-    const bool pagers = std::strncmp(*entry, "LESS", 4) == 0 &&
-                        std::strncmp(*entry, kLessSecure, std::strlen(kLessSecure)) != 0;
-    if (!pagers && !(path && HostRootConfined())) {
-      entries.emplace_back(*entry);
-    }
-  }
-  if (HostRootConfined()) {
-    entries.push_back("PATH=" + ProgramSearchPath());
-  }
+std::vector<std::string> PagerEnvironment() {
+  std::vector<std::string> entries = ChildEnvironment();
+  std::erase_if(entries, [](const std::string& entry) {
+    return entry.starts_with("LESS") && !entry.starts_with(std::string(kLessSecure) + "=");
+  });
   entries.push_back(std::string(kLessHistoryFile) + "=-");
   entries.push_back(std::string(kLessCharacterSet) + "=ascii");
   return entries;
@@ -119,7 +109,7 @@ void ShowLogInPager(RuntimeFrame* screen, const std::string& path) {
   ForegroundEnd end;
   {
     EnvironmentOverride secure(kLessSecure, "1");
-    end = RunInForeground(HostPath(kPager), PagerArguments(file), ChildEnvironment(), true);
+    end = RunInForeground(HostPath(kPager), PagerArguments(file), PagerEnvironment(), true);
   }
 
   TakeTerminalBack(haveAttributes ? &consoleAttributes : nullptr);
