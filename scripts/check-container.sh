@@ -109,37 +109,24 @@ echo $! >/run/tulk-stray.pid
 sleep 1
 EOF
 chmod 755 "$root/usr/local/sbin/tulk-sandbox-probe" "$root/usr/local/sbin/tulk-hung-tool"
-for instance in stray probe power; do
-  mkdir -p "$root/etc/systemd/system/tulk-serial@$instance.service.d"
-done
-cat >"$root/etc/systemd/system/tulk-serial@stray.service.d/stray.conf" <<'EOF'
-[Service]
-StandardInput=null
-StandardOutput=journal
-ExecStartPre=
-ExecStart=
-ExecStart=/usr/local/sbin/tulk-hung-tool
-EOF
-cat >"$root/etc/systemd/system/tulk-serial@probe.service.d/probe.conf" <<'EOF'
-[Service]
-Type=oneshot
-Restart=no
-StandardInput=null
-StandardOutput=journal
-ExecStartPre=
-ExecStart=
-ExecStart=/usr/local/sbin/tulk-sandbox-probe
-EOF
-cat >"$root/etc/systemd/system/tulk-serial@power.service.d/power.conf" <<'EOF'
-[Service]
-Type=oneshot
-Restart=no
-StandardInput=null
-StandardOutput=journal
-ExecStartPre=
-ExecStart=
-ExecStart=/bin/systemctl poweroff
-EOF
+# A drop-in for the serial unit's instance: the unit's own sandbox with
+# another program; a oneshot one runs once and is not restarted.
+serial_drop_in() {
+  local instance=$1 program=$2 oneshot=$3
+  local folder="$root/etc/systemd/system/tulk-serial@$instance.service.d"
+  mkdir -p "$folder"
+  {
+    echo "[Service]"
+    if ((oneshot)); then
+      printf 'Type=oneshot\nRestart=no\n'
+    fi
+    printf 'StandardInput=null\nStandardOutput=journal\nExecStartPre=\nExecStart=\nExecStart=%s\n' \
+      "$program"
+  } >"$folder/$instance.conf"
+}
+serial_drop_in stray /usr/local/sbin/tulk-hung-tool 0
+serial_drop_in probe /usr/local/sbin/tulk-sandbox-probe 1
+serial_drop_in power "/bin/systemctl poweroff" 1
 cat >"$root/etc/systemd/system/tulk-probe-idle.service" <<'EOF'
 [Service]
 ExecStart=/bin/sleep infinity

@@ -6,6 +6,7 @@
 #include <map>
 #include <optional>
 #include <string>
+#include <utility>
 #include <vector>
 
 namespace TulkTest {
@@ -46,5 +47,14 @@ struct Options {
   /// "denied", "chauthtok-fails".
   std::vector<std::string> pamPolicy;
 };
+
+/// Options that run `program`, a test program of this build, instead of
+/// tulk, in a root without the simulated host tools.
+inline Options TestProgram(std::string program) {
+  Options options;
+  options.program = std::move(program);
+  options.hostTools = false;
+  return options;
+}
 
 }  // namespace TulkTest

@@ -206,10 +206,7 @@ TEST(Ending, IgnoredHangUpSignalStaysIgnoredUntilTheLineGoes) {
 
 TEST(Ending, HangUpAndBrokenPipeSignalsRestoreTheTerminal) {
   for (int signal : {SIGHUP, SIGPIPE}) {
-    Options options;
-    options.program = TULK_TEST_KEYECHO_BINARY;
-    options.hostTools = false;
-    TestConsole console(options);
+    TestConsole console(TulkTest::TestProgram(TULK_TEST_KEYECHO_BINARY));
     ASSERT_TRUE(console.WaitForText("KEYECHO active"));
     const termios before = *console.TerminalAttributes();
     console.Signal(signal);

@@ -18,19 +18,12 @@ using namespace std::chrono_literals;
 using TulkTest::Options;
 using TulkTest::TestConsole;
 
-Options KeyEcho() {
-  Options options;
-  options.program = TULK_TEST_KEYECHO_BINARY;
-  options.hostTools = false;
-  return options;
-}
-
 // Terminal sequences arrive as curses keys, a lone Esc as Esc, a key right
 // after Esc without delay; readiness comes only once every key sent has
 // been handled; the reload signal reaches the current frame; a normal end
 // writes the palette reset.
 TEST(KeyLoop, KeysReadinessReloadAndANormalEnd) {
-  Options options = KeyEcho();
+  Options options = TulkTest::TestProgram(TULK_TEST_KEYECHO_BINARY);
   options.keepOutput = true;
   TestConsole console(options);
   ASSERT_TRUE(console.WaitForText("KEYECHO active"));
@@ -99,7 +92,7 @@ TEST(KeyLoop, KeysReadinessReloadAndANormalEnd) {
 }
 
 TEST(KeyLoop, ReadinessDescriptorOnTheTerminalIsIgnored) {
-  Options options = KeyEcho();
+  Options options = TulkTest::TestProgram(TULK_TEST_KEYECHO_BINARY);
   options.keepOutput = true;
   options.env["TULK_READY_FD"] = "1";
   TestConsole console(options);
@@ -112,7 +105,7 @@ TEST(KeyLoop, ReadinessDescriptorOnTheTerminalIsIgnored) {
 }
 
 TEST(KeyLoop, SequenceSplitLikeASlowSerialLineIsStillAssembled) {
-  Options options = KeyEcho();
+  Options options = TulkTest::TestProgram(TULK_TEST_KEYECHO_BINARY);
   // A busy test machine may hold the harness back between two bytes longer
   // than the default delay; a slow line's operator would set it so.
   options.env["ESCDELAY"] = "1000";
@@ -129,7 +122,7 @@ TEST(KeyLoop, SequenceSplitLikeASlowSerialLineIsStillAssembled) {
 }
 
 TEST(KeyLoop, DimsAfterAMinuteAndTheWakingKeyIsDelivered) {
-  Options options = KeyEcho();
+  Options options = TulkTest::TestProgram(TULK_TEST_KEYECHO_BINARY);
   options.timeScale = 300;  // one console minute = 0.2 s
   TestConsole console(options);
   ASSERT_TRUE(console.WaitForText("KEYECHO dimmed"));
@@ -142,7 +135,7 @@ TEST(KeyLoop, DimsAfterAMinuteAndTheWakingKeyIsDelivered) {
 }
 
 TEST(KeyLoop, IdleTimeoutBelowAMinuteCountsAsAMinute) {
-  Options options = KeyEcho();
+  Options options = TulkTest::TestProgram(TULK_TEST_KEYECHO_BINARY);
   options.timeScale = 60;
   options.keepOutput = true;
   options.env["TULK_KEYECHO_SESSION"] = "1";
@@ -158,7 +151,7 @@ TEST(KeyLoop, IdleTimeoutBelowAMinuteCountsAsAMinute) {
 }
 
 TEST(KeyLoop, IdleTimeoutOfZeroNeverEndsTheSessionButStillDims) {
-  Options options = KeyEcho();
+  Options options = TulkTest::TestProgram(TULK_TEST_KEYECHO_BINARY);
   options.timeScale = 600;
   options.env["TULK_KEYECHO_SESSION"] = "1";
   options.env["TULK_KEYECHO_IDLE_TIMEOUT"] = "0";
@@ -170,14 +163,14 @@ TEST(KeyLoop, IdleTimeoutOfZeroNeverEndsTheSessionButStillDims) {
 }
 
 TEST(KeyLoop, UnreadableTimeoutDefaultsToTenMinutes) {
-  Options options = KeyEcho();
+  Options options = TulkTest::TestProgram(TULK_TEST_KEYECHO_BINARY);
   options.env["TULK_KEYECHO_SESSION"] = "1";
   TestConsole console(options);
   ASSERT_TRUE(console.WaitForText("idle timeout: 600"));
 }
 
 TEST(KeyLoop, ExitRequestDuringASessionIsDeferred) {
-  Options options = KeyEcho();
+  Options options = TulkTest::TestProgram(TULK_TEST_KEYECHO_BINARY);
   options.env["TULK_KEYECHO_SESSION"] = "1";
   TestConsole console(options);
   ASSERT_TRUE(console.WaitForText("exitPending: 0"));
@@ -196,7 +189,7 @@ TEST(KeyLoop, ExitRequestDuringASessionIsDeferred) {
 }
 
 TEST(KeyLoop, SignalEndsWithoutThePaletteReset) {
-  Options options = KeyEcho();
+  Options options = TulkTest::TestProgram(TULK_TEST_KEYECHO_BINARY);
   options.keepOutput = true;
   TestConsole console(options);
   ASSERT_TRUE(console.WaitForText("KEYECHO active"));

@@ -22,15 +22,8 @@ using namespace std::chrono_literals;
 using TulkTest::Options;
 using TulkTest::TestConsole;
 
-Options KeyEcho() {
-  Options options;
-  options.program = TULK_TEST_KEYECHO_BINARY;
-  options.hostTools = false;
-  return options;
-}
-
 TEST(TerminalHygiene, CtrlSIsAKeyAndFlowControlComesBackAtExit) {
-  TestConsole console(KeyEcho());
+  TestConsole console(TulkTest::TestProgram(TULK_TEST_KEYECHO_BINARY));
   ASSERT_TRUE(console.WaitForText("KEYECHO active"));
   // With XON/XOFF on, the line would swallow Ctrl-S and stop the console's
   // output until a Ctrl-Q, and the exit below would wait for it too.
@@ -48,7 +41,7 @@ TEST(TerminalHygiene, CtrlSIsAKeyAndFlowControlComesBackAtExit) {
 }
 
 TEST(TerminalHygiene, EscDelayFromTheEnvironmentIsHonoured) {
-  Options options = KeyEcho();
+  Options options = TulkTest::TestProgram(TULK_TEST_KEYECHO_BINARY);
   // A remote line slow enough to split a sequence by a third of a second.
   options.env["ESCDELAY"] = "10000";
   TestConsole console(options);
@@ -76,7 +69,7 @@ class ClockStep {
   /// A key-echo session with an idle timeout of ten minutes, whose console
   /// minute lasts 60 / `timeScale` real seconds, under the preload.
   Options SessionOptions(double timeScale) const {
-    Options options = KeyEcho();
+    Options options = TulkTest::TestProgram(TULK_TEST_KEYECHO_BINARY);
     options.timeScale = timeScale;
     options.env["TULK_KEYECHO_SESSION"] = "1";
     options.env["TULK_KEYECHO_IDLE_TIMEOUT"] = "600";

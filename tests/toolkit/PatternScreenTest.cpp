@@ -14,22 +14,16 @@
 #include <thread>
 
 #include "TestConsole.h"
+#include "ToolkitScene.h"
 #include "include/ColorNumbers.h"
 
 namespace {
 
 using namespace std::chrono_literals;
 using namespace Tulk;
+using ToolkitTest::Scene;
 using TulkTest::Options;
 using TulkTest::TestConsole;
-
-Options Scene(const char* scene) {
-  Options options;
-  options.program = TULK_TEST_TOOLKIT_DEMO_BINARY;
-  options.hostTools = false;
-  options.env["TULK_DEMO_SCENE"] = scene;
-  return options;
-}
 
 // Writes `text` into the FIFO once the worker has opened it for reading (a
 // bounded wait: a worker that never reads fails the test, not the run).

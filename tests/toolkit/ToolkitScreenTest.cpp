@@ -7,22 +7,16 @@
 #include <string>
 
 #include "TestConsole.h"
+#include "ToolkitScene.h"
 #include "include/ColorNumbers.h"
 
 namespace {
 
 using namespace std::chrono_literals;
 using namespace Tulk;
+using ToolkitTest::Scene;
 using TulkTest::Options;
 using TulkTest::TestConsole;
-
-Options Scene(const char* scene) {
-  Options options;
-  options.program = TULK_TEST_TOOLKIT_DEMO_BINARY;
-  options.hostTools = false;
-  options.env["TULK_DEMO_SCENE"] = scene;
-  return options;
-}
 
 // `count` cells of a row from `col` on (Row() is UTF-8, so line-drawing
 // characters make its byte offsets differ from columns).
