@@ -88,7 +88,7 @@ bool OwnedBy(const fs::path& folder, const std::vector<pid_t>& pids) {
 
 }  // namespace
 
-std::vector<pid_t> SignalSession(pid_t leader, int signal) {
+std::vector<pid_t> SessionMembers(pid_t leader) {
   std::vector<pid_t> members;
   std::error_code error;
   for (fs::directory_iterator it("/proc", error), end; !error && it != end; it.increment(error)) {
@@ -98,11 +98,22 @@ std::vector<pid_t> SignalSession(pid_t leader, int signal) {
     }
     const pid_t pid = static_cast<pid_t>(std::stoll(name));
     if (pid != leader && SessionOf(it->path()) == leader) {
-      kill(pid, signal);
       members.push_back(pid);
     }
   }
   return members;
+}
+
+std::vector<pid_t> SignalSession(pid_t leader, int signal) {
+  std::vector<pid_t> members = SessionMembers(leader);
+  for (pid_t pid : members) {
+    kill(pid, signal);
+  }
+  return members;
+}
+
+std::string ProcFile(pid_t pid, const std::string& name) {
+  return ReadAll(fs::path("/proc") / std::to_string(pid) / name);
 }
 
 void RemovePamFolders(const std::string& marker, const std::vector<pid_t>& pids) {

@@ -19,6 +19,15 @@
 
 namespace TulkTest {
 
+/// The processes of the session led by `leader` (the pseudo-terminal's
+/// program and whatever it started and did not move to a session of its
+/// own), except the leader.
+std::vector<pid_t> SessionMembers(pid_t leader);
+
+/// The text of /proc/<pid>/<name> ("comm", "status"), empty when it cannot
+/// be read (also when the process ends during the read).
+std::string ProcFile(pid_t pid, const std::string& name);
+
 /// Sends `signal` to every process of the session led by `leader` (the
 /// pseudo-terminal's program and whatever it started and did not move to a
 /// session of its own), except the leader; returns their ids. The leader

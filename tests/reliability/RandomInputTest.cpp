@@ -9,19 +9,17 @@
 // burst left it running, it is quit ("q", Ctrl-C) as an operator would,
 // and the console must answer again.
 
-#include <dirent.h>
 #include <gtest/gtest.h>
 #include <signal.h>
 
 #include <algorithm>
 #include <chrono>
 #include <cstdio>
-#include <cstring>
-#include <fstream>
 #include <memory>
 #include <string>
 #include <vector>
 
+#include "ProcessHygiene.h"
 #include "ReliabilitySupport.h"
 #include "ScreenTestSupport.h"
 
@@ -53,37 +51,12 @@ constexpr long kGrowthKiB = 2048;
 
 // The id of a process named "less" in the console's session, or 0.
 pid_t PagerOf(pid_t console) {
-  pid_t found = 0;
-  DIR* proc = opendir("/proc");
-  if (proc == nullptr) {
-    return 0;
-  }
-  while (dirent* entry = readdir(proc)) {
-    const pid_t pid = static_cast<pid_t>(std::atoi(entry->d_name));
-    if (pid <= 0 || pid == console) {
-      continue;
-    }
-    std::ifstream stat("/proc/" + std::to_string(pid) + "/stat");
-    std::string line;
-    std::getline(stat, line);
-    const std::size_t open = line.find('(');
-    const std::size_t close = line.rfind(')');
-    if (open == std::string::npos || close == std::string::npos) {
-      continue;
-    }
-    const std::string name = line.substr(open + 1, close - open - 1);
-    int parent = 0;
-    int group = 0;
-    int session = 0;
-    char state = 0;
-    if (std::sscanf(line.c_str() + close + 1, " %c %d %d %d", &state, &parent, &group, &session) ==
-            4 &&
-        session == console && name == "less") {
-      found = pid;
+  for (pid_t pid : TulkTest::SessionMembers(console)) {
+    if (TulkTest::ProcFile(pid, "comm") == "less\n") {
+      return pid;
     }
   }
-  closedir(proc);
-  return found;
+  return 0;
 }
 
 struct Figures {

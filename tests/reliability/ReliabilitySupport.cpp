@@ -1,18 +1,15 @@
 #include "ReliabilitySupport.h"
 
-#include <fcntl.h>
 #include <termios.h>
-#include <unistd.h>
 
 #include <algorithm>
 #include <array>
 #include <chrono>
 #include <cstdio>
 #include <cstdlib>
-#include <cstring>
-#include <fstream>
 
 #include "KeyNames.h"
+#include "ProcessHygiene.h"
 
 namespace Reliability {
 
@@ -56,19 +53,9 @@ std::vector<std::string> EntryTitles(TulkTest::TestConsole& console) {
 }
 
 long ResidentKiB(pid_t pid) {
-  const std::string path = "/proc/" + std::to_string(pid) + "/status";
-  const int fd = open(path.c_str(), O_RDONLY | O_CLOEXEC);
-  if (fd < 0) {
-    return 0;
-  }
-  std::array<char, 4096> buffer{};
-  const ssize_t count = read(fd, buffer.data(), buffer.size() - 1);
-  close(fd);
-  if (count <= 0) {
-    return 0;
-  }
-  const char* line = std::strstr(buffer.data(), "VmRSS:");
-  return line == nullptr ? 0 : std::strtol(line + 6, nullptr, 10);
+  const std::string status = TulkTest::ProcFile(pid, "status");
+  const std::size_t line = status.find("VmRSS:");
+  return line == std::string::npos ? 0 : std::strtol(status.c_str() + line + 6, nullptr, 10);
 }
 
 ::testing::AssertionResult TerminalGivenBack(const TulkTest::TestConsole& console,

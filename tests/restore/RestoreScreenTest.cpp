@@ -210,6 +210,8 @@ TEST(SafeModeScreenTest, ManagementMovesToTheNextFreeSwitchAndTheEntryTurnsGrey)
   console.Key("F11");
   ASSERT_TRUE(console.WaitForLog(
       "<14>Enabling safe mode networking by moving all uplinks to a new management vSwitch"));
+  // The menu is read once the question has gone from over it.
+  ASSERT_TRUE(Gone(console, "Move the management network onto a standard switch?"));
   ASSERT_TRUE(console.WaitUntil([&] { return RightTitle(console) == "Restore DVS"; },
                                 "the cursor on Restore DVS"));
   EXPECT_TRUE(console.WaitUntil([&] { return Greyed(console, "Restore Standard Switch"); },
