@@ -13,7 +13,7 @@ set -euo pipefail
 seconds="${1:-60}"
 root="$(cd "$(dirname "$0")/.." && pwd)"
 build="${TULK_FUZZ_BUILD_DIR:-$root/build/fuzz}"
-targets=(fuzz_markup_layout fuzz_input_field)
+targets=(fuzz_markup_layout fuzz_input_field fuzz_attribute_filter)
 
 cd "$root"
 cmake --preset fuzz -B "$build" >/dev/null

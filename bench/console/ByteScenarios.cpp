@@ -144,6 +144,12 @@ void MeasureSession(const TerminalProfile& profile, const std::string& program,
   const Screen first = Picture(console, profile, false);
   figures.Add("first_screen", static_cast<double>(console.BytesReceived()),
               FewestBytes(start, first, profile) + profile.setup);
+  if (std::getenv("TULK_BENCH_TRACE") != nullptr) {
+    const Change change{static_cast<double>(console.BytesReceived()),
+                        static_cast<double>(FewestBytes(start, first, profile) + profile.setup),
+                        true};
+    Trace("(first screen)", change, console.Output(), start, first);
+  }
 
   Settle(console, 200ms);
   console.Key("F2");

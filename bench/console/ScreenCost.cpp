@@ -3,6 +3,7 @@
 #include <algorithm>
 #include <map>
 #include <string>
+#include <vector>
 
 namespace TulkBench {
 namespace {
@@ -113,7 +114,64 @@ class Encoder {
       best = std::min(best,
                       OffCost(state.sgr, to) + OnCost(state.sgr, to) + ColourCost(state.sgr, to));
     }
+    if (p_.combinedSgr) {
+      best = std::min(best, CombinedCost(state, to));
+    }
     return best;
+  }
+
+  // One SGR with every change as a parameter: from the state, when nothing
+  // is switched off, or from a reset ("0") and what `to` has on top of it.
+  // It leaves the line-drawing set as it is.
+  int CombinedCost(const State& state, const Sgr& to) const {
+    std::vector<std::string> fromReset{"0"};
+    if (!Changes(Sgr{}, to, fromReset)) {
+      return kImpossible;
+    }
+    int best = TerminalProfile::CombinedCost(fromReset);
+    const Sgr& from = state.sgr;
+    const bool switchesOff = (from.bold && !to.bold) || (from.reverse && !to.reverse) ||
+                             (from.underline && !to.underline);
+    const bool defaultsColour = (from.fg >= 0 && to.fg < 0) || (from.bg >= 0 && to.bg < 0);
+    if (state.sgrKnown && !switchesOff && (!defaultsColour || p_.defaultColourParameters)) {
+      std::vector<std::string> changes;
+      if (Changes(from, to, changes)) {
+        best = std::min(best, TerminalProfile::CombinedCost(changes));
+      }
+    }
+    return best;
+  }
+
+  // The SGR parameters that turn `from` into `to`, nothing being switched
+  // off; false for a colour the profile has no parameter for.
+  bool Changes(const Sgr& from, const Sgr& to, std::vector<std::string>& parameters) const {
+    if (to.bold && !from.bold) {
+      parameters.push_back("1");
+    }
+    if (to.underline && !from.underline) {
+      parameters.push_back("4");
+    }
+    if (to.reverse && !from.reverse) {
+      parameters.push_back("7");
+    }
+    auto colour = [&](int wanted, int had, const std::map<int, std::string>& texts,
+                      const char* byDefault) {
+      if (wanted == had) {
+        return true;
+      }
+      if (wanted < 0) {
+        parameters.push_back(byDefault);
+        return true;
+      }
+      auto found = texts.find(wanted);
+      if (found == texts.end()) {
+        return false;
+      }
+      parameters.push_back(found->second);
+      return true;
+    };
+    return colour(to.fg, from.fg, p_.foregroundParameters, "39") &&
+           colour(to.bg, from.bg, p_.backgroundParameters, "49");
   }
 
   int MoveCost(const State& state, int row, int col) const {
@@ -497,10 +555,21 @@ int FewestBytes(const Screen& before, const Screen& after, const TerminalProfile
         profile.capabilities.count("sgr0") != 0 ? profile.capabilities.at("sgr0") : std::string();
     const bool resetLeavesSet =
         profile.Has("rmacs") && reset.find(profile.capabilities.at("rmacs")) != std::string::npos;
-    best.bytes += best.sgr == Sgr{} ? 0 : profile.Cost("sgr0");
+    State byReset = best;
+    byReset.bytes += best.sgr == Sgr{} ? 0 : profile.Cost("sgr0");
     if (best.lineSet && !(resetLeavesSet && !(best.sgr == Sgr{}))) {
-      encoder.LeaveLineSet(best);
+      encoder.LeaveLineSet(byReset);
     }
+    if (profile.combinedSgr) {
+      // "\e[m", and leaving the set on its own.
+      State combined = best;
+      combined.bytes += best.sgr == Sgr{} ? 0 : TerminalProfile::CombinedCost({"0"});
+      if (best.lineSet) {
+        encoder.LeaveLineSet(combined);
+      }
+      byReset.bytes = std::min(byReset.bytes, combined.bytes);
+    }
+    best.bytes = byReset.bytes;
   }
   if (after.cursor.visible) {
     best.bytes += encoder.MoveCost(best, after.cursor.row, after.cursor.col);

@@ -15,7 +15,10 @@
 ///   unchanged cells in between;
 /// - the attributes: only the colour that changed (setaf or setab), the
 ///   attributes switched on one by one, or a reset (sgr0) or "sgr" and
-///   what is needed after it, whichever is shortest;
+///   what is needed after it, whichever is shortest; where the
+///   description's controls are ECMA-48 SGR and its own "sgr" combines
+///   parameters, also all the changes in one SGR ("\e[37;42m"), or a reset
+///   and what is needed after it in one ("\e[0;7;37m", a lone "\e[m");
 /// - the character: one byte in ASCII; a line character one byte in the
 ///   terminal's line-drawing set, where it has one and entering and
 ///   leaving the set pays off, its UTF-8 bytes otherwise;

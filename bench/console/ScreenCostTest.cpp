@@ -54,6 +54,18 @@ TerminalProfile Xterm() {
   return profile;
 }
 
+// The same with several SGR parameters in one control.
+TerminalProfile CombiningXterm() {
+  TerminalProfile profile = Xterm();
+  profile.combinedSgr = true;
+  for (int colour = 0; colour < 8; ++colour) {
+    profile.foregroundParameters[colour] = "3" + std::to_string(colour);
+    profile.backgroundParameters[colour] = "4" + std::to_string(colour);
+  }
+  profile.defaultColourParameters = true;
+  return profile;
+}
+
 Screen Hidden(int rows, int cols) {
   Screen screen = BlankScreen(rows, cols);
   screen.cursor.visible = false;
@@ -119,6 +131,18 @@ TEST(ScreenCostTest, FewestBytesOfTypicalChanges) {
          }
        },
        11},
+      // ESC [ 3 7 m ESC [ 4 2 m a, then ESC [ m at the end ...
+      {"two colours, one by one", Xterm(),
+       [](Screen& s) {
+         Write(s, 0, 0, "a", Cell{"", 7, 2});
+       },
+       14},
+      // ... or ESC [ 3 7 ; 4 2 m a ESC [ m where SGR combines.
+      {"two colours in one control", CombiningXterm(),
+       [](Screen& s) {
+         Write(s, 0, 0, "a", Cell{"", 7, 2});
+       },
+       12},
       // ESC [ 3 ; 4 H, then the cursor shown.
       {"the cursor shown", Xterm(),
        [](Screen& s) {

@@ -84,6 +84,45 @@ int TerminalProfile::SetAttributesCost(bool underline, bool reverse, bool bold,
                                  bold ? 1 : 0, 0, 0, lineSet ? 1 : 0));
 }
 
+int TerminalProfile::CombinedCost(const std::vector<std::string>& parameters) {
+  int cost = 3;  // CSI and the final "m"; a lone reset is "CSI m"
+  if (parameters.size() == 1 && parameters[0] == "0") {
+    return cost;
+  }
+  for (std::size_t i = 0; i < parameters.size(); ++i) {
+    cost += static_cast<int>(parameters[i].size()) + (i == 0 ? 0 : 1);
+  }
+  return cost;
+}
+
+namespace {
+
+// The parameters of `control` when it is one SGR ("\e[...m"); otherwise
+// empty.
+std::string SgrParameters(const char* control) {
+  const std::string text = control != nullptr ? control : "";
+  if (text.size() < 4 || text.compare(0, 2, "\x1b[") != 0 || text.back() != 'm' ||
+      text.find_first_not_of("0123456789;", 2) != text.size() - 1) {
+    return {};
+  }
+  return text.substr(2, text.size() - 3);
+}
+
+// The description's "sgr" with bold and reverse on holds one SGR with both
+// (next to other controls, such as a shift into the line-drawing set).
+bool SgrCombines(const std::string& sgr) {
+  const std::string text = tiparm(sgr.c_str(), 0, 0, 1, 0, 0, 1, 0, 0, 0);
+  const std::size_t start = text.find("\x1b[");
+  const std::size_t end = start == std::string::npos ? start : text.find('m', start);
+  if (end == std::string::npos) {
+    return false;
+  }
+  const std::string parameters = SgrParameters(text.substr(start, end + 1 - start).c_str());
+  return parameters.find(';') != std::string::npos;
+}
+
+}  // namespace
+
 TerminalProfile ReadTerminalProfile(const std::string& term) {
   TERMINAL* previous = cur_term;
   int error = 0;
@@ -116,6 +155,17 @@ TerminalProfile ReadTerminalProfile(const std::string& term) {
       profile.setup += CapabilityLength(
           tiparm(initc.c_str(), entry.colour, entry.red, entry.green, entry.blue, 0, 0, 0, 0, 0));
     }
+  }
+  if (profile.Has("sgr") && SgrCombines(profile.capabilities["sgr"])) {
+    profile.combinedSgr = true;
+    for (int colour = 0; profile.colours && colour < 256 && profile.combinedSgr; ++colour) {
+      std::string foreground = SgrParameters(tiparm(profile.capabilities["setaf"].c_str(), colour));
+      std::string background = SgrParameters(tiparm(profile.capabilities["setab"].c_str(), colour));
+      profile.combinedSgr = !foreground.empty() && !background.empty();
+      profile.foregroundParameters[colour] = foreground;
+      profile.backgroundParameters[colour] = background;
+    }
+    profile.defaultColourParameters = profile.capabilities["op"] == "\x1b[39;49m";
   }
   TERMINAL* read = cur_term;
   set_curterm(previous);

@@ -6,6 +6,7 @@
 
 #include <map>
 #include <string>
+#include <vector>
 
 namespace TulkBench {
 
@@ -20,6 +21,15 @@ struct TerminalProfile {
   /// The string capabilities by terminfo name ("cup", "setaf", "smacs",
   /// ...), as the description holds them.
   std::map<std::string, std::string> capabilities;
+  /// The description's attribute controls are ECMA-48 SGR, and its own
+  /// "sgr" puts several parameters in one control: a program may then send
+  /// several changes as one SGR ("\e[37;42m"), a reset as "\e[m".
+  bool combinedSgr = false;
+  /// The SGR parameter of each colour by number, foreground and background
+  /// ("37", "38;5;123"), where combinedSgr holds.
+  std::map<int, std::string> foregroundParameters, backgroundParameters;
+  /// "op" is "\e[39;49m": the default colours are SGR 39 and 49.
+  bool defaultColourParameters = false;
   /// The keys of the line-drawing set ("q" the horizontal line, ...).
   std::string lineSetKeys;
   /// Bytes of the set-up the console cannot do without before its first
@@ -39,6 +49,8 @@ struct TerminalProfile {
   /// Bytes of "sgr" setting exactly these attributes (and the line-drawing
   /// set on or off); a huge number when the terminal has no "sgr".
   int SetAttributesCost(bool underline, bool reverse, bool bold, bool lineSet) const;
+  /// Bytes of one SGR with these parameters (combinedSgr).
+  static int CombinedCost(const std::vector<std::string>& parameters);
 };
 
 /// Reads the profile of `term` from the terminfo database. Throws

@@ -16,6 +16,7 @@
 #include "runtime/SignalThread.h"
 #include "runtime/SystemLog.h"
 #include "runtime/Terminal.h"
+#include "runtime/TerminalOutput.h"
 
 namespace Tulk {
 namespace {
@@ -60,10 +61,11 @@ void StartCurses() {
     TerminalUnusable();
   }
   del_curterm(cur_term);
-  if (newterm(nullptr, stdout, stdin) == nullptr) {
+  if (newterm(nullptr, OpenCursesOutput(), stdin) == nullptr) {
     TerminalUnusable();
   }
   start_color();
+  ChooseOutputFilter();
   std::atexit(EndWindowAtExit);
   curs_set(0);
   cbreak();
@@ -116,7 +118,8 @@ int ConsoleMain(int argc, char** argv, const ConsoleHooks& hooks) {
   StartCurses();
   InitColors();
   DefineKeys();
-  refresh();
+  wnoutrefresh(stdscr);
+  UpdateTerminal();
 
   if (hooks.afterStartup) {
     hooks.afterStartup();
@@ -126,7 +129,8 @@ int ConsoleMain(int argc, char** argv, const ConsoleHooks& hooks) {
   }
 
   erase();
-  refresh();
+  wnoutrefresh(stdscr);
+  UpdateTerminal();
   endwin();
   static const char kPaletteReset[] = "\x1b]R";
   ssize_t written = write(1, kPaletteReset, 3);

@@ -18,6 +18,7 @@
 #include "runtime/ScreenFlush.h"
 #include "runtime/SignalThread.h"
 #include "runtime/SystemLog.h"
+#include "runtime/TerminalOutput.h"
 #include "runtime/WorkerResult.h"
 
 namespace Tulk {
@@ -238,7 +239,8 @@ void HandleResize() {
   }
   resizeterm(size.ws_row, size.ws_col);
   Log(LOG_INFO, "Resized window to %dx%d", size.ws_col, size.ws_row);
-  refresh();
+  wnoutrefresh(stdscr);
+  UpdateTerminal();
 }
 
 void SetLoggedIn(bool value) {

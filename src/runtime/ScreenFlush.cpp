@@ -4,6 +4,7 @@
 #include <unistd.h>
 
 #include "runtime/HostQueryScope.h"
+#include "runtime/TerminalOutput.h"
 
 namespace Tulk {
 namespace {
@@ -47,7 +48,7 @@ void FlushScreen() {
   } else {
     curs_set(0);
   }
-  doupdate();
+  UpdateTerminal();
   if (g_cursor.visible) {
     curs_set(1);
   }

@@ -17,6 +17,7 @@
 #include "runtime/RuntimeFrame.h"
 #include "runtime/SystemLog.h"
 #include "runtime/Terminal.h"
+#include "runtime/TerminalOutput.h"
 #include "screens/EnvironmentOverride.h"
 #include "toolkit/Window.h"
 
@@ -52,6 +53,8 @@ void GiveStartupAttributes() {
 }
 
 void TakeTerminalBack(const termios* consoleAttributes) {
+  // The pager left the terminal's attributes as it pleased.
+  ForgetTerminalAttributes();
   if (consoleAttributes != nullptr) {
     tcsetattr(STDOUT_FILENO, TCSANOW, consoleAttributes);
   }
@@ -102,7 +105,8 @@ void ShowLogInPager(RuntimeFrame* screen, const std::string& path) {
   // the terminal with the cursor as it stood when the pager started.
   curs_set(1);
   clear();
-  refresh();
+  wnoutrefresh(stdscr);
+  UpdateTerminal();
   RuntimeFrame* current = currentWindow;
   currentWindow = nullptr;
 

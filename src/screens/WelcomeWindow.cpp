@@ -74,7 +74,10 @@ void WelcomeWindow::CreatePanels() {
   const int lowerHeight = Height() - upperHeight;
   Erase();
   upperPanel_ = new Window(this, 0, 0, cols, upperHeight, kDarkGrey, kWhite);
-  lowerPanel_ = new Window(this, 0, upperHeight, cols, lowerHeight, kYellow, kWhite);
+  // The lower panel's own cells are blank: they take the colour of the
+  // text beside them, so that the terminal is not told to change colour
+  // for cells where no colour shows.
+  lowerPanel_ = new Window(this, 0, upperHeight, cols, lowerHeight, kYellow, kBlack);
   Box();
   versionLine_ = new TextArea(upperPanel_, 8, 5, cols - 16, 1);
   hardwareLine_ = new TextArea(upperPanel_, 8, 7, cols - 16, 1);

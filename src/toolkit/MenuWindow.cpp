@@ -2,6 +2,7 @@
 
 #include <curses.h>
 
+#include "include/ColorNumbers.h"
 #include "include/Keys.h"
 #include "runtime/KeyInput.h"
 #include "toolkit/Footer.h"
@@ -47,6 +48,9 @@ void MenuWindow::Relabel(std::size_t position) {
   LabelItem& item = *items_[position];
   item.SetText(entry.enabled ? entry.label : Greyed(entry.label));
   item.SetEnabled(entry.enabled);
+  if (entry.label.empty()) {
+    item.SetForeground(kBlack);  // a spacer: no colour shows, none is sent
+  }
 }
 
 void MenuWindow::SetEnabled(std::size_t position, bool enabled) {

@@ -14,12 +14,15 @@
 
 namespace Tulk {
 
+// The panes' own cells are blank (margins, empty rows): they take the
+// colour of the text beside them, the menu's labels and the descriptions,
+// so that the terminal is not told to change colour where none shows.
 RootWindow::RootWindow(Frame* owner)
     : Frame(owner, 0, 0, COLS, LINES, kBlack, kWhite),
       statusLine_(new Window(this, 0, LINES - 1, COLS, 1, kBlack, kLightGrey)),
       mainArea_(new Window(this, 0, 0, COLS, LINES - 1, kLightGrey, kWhite)),
-      rightPane_(new Window(mainArea_, COLS / 2, 0, COLS / 2, LINES - 1, kDarkGrey, kWhite)),
-      leftPane_(new Window(mainArea_, 0, 0, COLS / 2, LINES - 1, kYellow, kWhite)),
+      rightPane_(new Window(mainArea_, COLS / 2, 0, COLS / 2, LINES - 1, kDarkGrey, kLightGrey)),
+      leftPane_(new Window(mainArea_, 0, 0, COLS / 2, LINES - 1, kYellow, kBlack)),
       rightTitle_(new TextArea(rightPane_, 2, 1, COLS / 2 - 6, 1, -1, kWhite)),
       leftTitle_(new TextArea(leftPane_, 3, 1, COLS / 2 - 6, 1, -1, kBlack)),
       leftFooter_(new TextArea(leftPane_, 2, LINES - 3, COLS / 2 - 3, 1, -1, kBlack)),

@@ -40,7 +40,9 @@ std::vector<json> Ipv6Networks(int count) {
 // repaint; a reload whose version query fails keeps the last version line.
 TEST(WelcomeScreenTest, ShowsTheDemoHostTogglesMonochromeAndReloads) {
   json host = DemoHostState();
-  TestConsole console(ConsoleOptions(host));
+  TulkTest::Options options = ConsoleOptions(host);
+  options.keepOutput = true;
+  TestConsole console(options);
   ASSERT_TRUE(Settled(console, "To manage this host, go to:"));
 
   EXPECT_EQ(Cells(console, kVersionRow, 8, 27), "Brimlo Tavi 8.1.0 (HyKernel");
@@ -86,8 +88,10 @@ TEST(WelcomeScreenTest, ShowsTheDemoHostTogglesMonochromeAndReloads) {
   const std::size_t before = console.BytesReceived();
   console.Type("x");
   ASSERT_TRUE(console.WaitReady());
-  // A full repaint: every cell is sent again.
-  EXPECT_GT(console.BytesReceived() - before, 80u * 20u);
+  // A full repaint: the screen is cleared and every line drawn again.
+  const std::string repaint = console.Output().substr(before);
+  EXPECT_NE(repaint.find("\x1b[2J"), std::string::npos);
+  EXPECT_GT(repaint.size(), 80u * 12u);
   EXPECT_TRUE(console.Contains("https://10.20.30.41/ (STATIC)"));
 
   host["faults"]["HSI_Get"] = "version unreadable";
