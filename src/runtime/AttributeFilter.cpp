@@ -82,8 +82,6 @@ bool Apply(std::string_view parameters, AttributeFilter::Rendition& rendition) {
       rendition.known = true;
     } else if (p <= 9) {
       rendition.attributes |= Bit(p);
-    } else if (p == 10) {
-      rendition.font.clear();
     } else if (p <= 19) {
       rendition.font = std::to_string(p);
     } else if (p == 22) {
@@ -113,16 +111,36 @@ bool Apply(std::string_view parameters, AttributeFilter::Rendition& rendition) {
   return true;
 }
 
-// One SGR with `parts` as its parameters; a lone reset as "CSI m".
+// SGR controls with `parts` as their parameters, in order; a lone reset as
+// "CSI m". A terminal keeps 16 numbers of a control, so more go out as
+// several controls.
 std::string SgrControl(const std::vector<std::string>& parts) {
-  std::string control = "\x1b[";
-  if (!(parts.size() == 1 && parts[0] == "0")) {
-    for (std::size_t i = 0; i < parts.size(); ++i) {
-      control += (i == 0 ? "" : ";") + parts[i];
-    }
+  constexpr std::size_t kMostNumbers = 16;
+  if (parts.size() == 1 && parts[0] == "0") {
+    return "\x1b[m";
   }
-  return control + "m";
+  std::string controls;
+  std::size_t numbers = kMostNumbers;
+  for (const std::string& part : parts) {
+    const std::size_t count =
+        1 + static_cast<std::size_t>(std::count(part.begin(), part.end(), ';'));
+    if (numbers + count > kMostNumbers) {
+      controls += controls.empty() ? "\x1b[" : "m\x1b[";
+      numbers = 0;
+    } else {
+      controls += ';';
+    }
+    controls += part;
+    numbers += count;
+  }
+  return controls + "m";
 }
+
+// The primary font (SGR 10). A rendition's font is empty after a reset,
+// which leaves the font as it was on some terminals (the Linux console,
+// where 10 to 12 choose the character mapping) and makes it the primary one
+// on others.
+constexpr const char* kPrimaryFont = "10";
 
 // `controls` without terminfo padding ("$<5>", "$<2/*>").
 std::string WithoutPadding(std::string_view controls) {
@@ -389,10 +407,23 @@ void AttributeFilter::Send() {
     out_ += wantedCharset_.shifted == 1 ? kShiftOut : kShiftIn;
     sentCharset_.shifted = wantedCharset_.shifted;
   }
-  if (wanted_.known && !(wanted_ == sent_)) {
+  if (wanted_.known && !Satisfied()) {
     out_ += Change();
+    // The primary font stays through a reset on every terminal.
+    const bool primary = sent_.known && sent_.font == kPrimaryFont;
     sent_ = wanted_;
+    if (primary && sent_.font.empty()) {
+      sent_.font = kPrimaryFont;
+    }
   }
+}
+
+bool AttributeFilter::Satisfied() const {
+  // A reset in the stream leaves the primary font as it is everywhere.
+  const bool font =
+      sent_.font == wanted_.font || (wanted_.font.empty() && sent_.font == kPrimaryFont);
+  return sent_.known && font && sent_.attributes == wanted_.attributes &&
+         sent_.foreground == wanted_.foreground && sent_.background == wanted_.background;
 }
 
 std::string AttributeFilter::Change() const {
@@ -408,7 +439,11 @@ std::string AttributeFilter::Change() const {
     }
   }
   std::string best = SgrControl(full);
-  if (!sent_.known || (sent_.attributes & ~wanted_.attributes) != 0) {
+  // Switching an attribute off, or the font back to what a reset leaves,
+  // takes a reset.
+  const bool fontByReset =
+      wanted_.font.empty() && !sent_.font.empty() && sent_.font != kPrimaryFont;
+  if (!sent_.known || (sent_.attributes & ~wanted_.attributes) != 0 || fontByReset) {
     return best;
   }
   const bool dropsColour = (!sent_.foreground.empty() && wanted_.foreground.empty()) ||
@@ -422,8 +457,8 @@ std::string AttributeFilter::Change() const {
       step.push_back(std::to_string(attribute));
     }
   }
-  if (sent_.font != wanted_.font) {
-    step.push_back(wanted_.font.empty() ? "10" : wanted_.font);
+  if (!wanted_.font.empty() && sent_.font != wanted_.font) {
+    step.push_back(wanted_.font);
   }
   if (sent_.foreground != wanted_.foreground) {
     step.push_back(wanted_.foreground.empty() ? "39" : wanted_.foreground);

@@ -76,7 +76,7 @@ class AttributeFilter {
   struct Rendition {
     bool known = false;
     unsigned attributes = 0;  // bit n: SGR n is on (1 to 9)
-    std::string font;         // "" for the primary font (SGR 10)
+    std::string font;         // "10" to "19"; "" as a reset leaves it
     std::string foreground;   // "" for the default colour
     std::string background;
     bool operator==(const Rendition&) const = default;
@@ -95,6 +95,7 @@ class AttributeFilter {
   void Finish();
   void Sgr(std::string_view parameters);
   void Send();
+  bool Satisfied() const;
   std::string Change() const;
   void Pass();
   void PassDependent();

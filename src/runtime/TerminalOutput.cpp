@@ -177,14 +177,12 @@ void UpdateTerminal() {
     return;
   }
   doupdate();
+  // Only a broken descriptor table keeps curses' descriptor on the
+  // in-memory file; the update still reaches the terminal, and every later
+  // update tries to point it back.
   const bool back = PointCursesAt(g_terminalFd);
   ReadUpdate();
   WriteAll(back ? g_cursesFd : g_terminalFd, g_filter->Filter(g_update));
-  if (!back) {
-    // Only possible with a broken descriptor table: the filter is given up
-    // rather than composing more updates where the terminal cannot see them.
-    g_filter.reset();
-  }
 }
 
 void ForgetTerminalAttributes() {
