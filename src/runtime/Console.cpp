@@ -118,8 +118,7 @@ int ConsoleMain(int argc, char** argv, const ConsoleHooks& hooks) {
   StartCurses();
   InitColors();
   DefineKeys();
-  wnoutrefresh(stdscr);
-  UpdateTerminal();
+  RefreshTerminal();
 
   if (hooks.afterStartup) {
     hooks.afterStartup();
@@ -129,8 +128,7 @@ int ConsoleMain(int argc, char** argv, const ConsoleHooks& hooks) {
   }
 
   erase();
-  wnoutrefresh(stdscr);
-  UpdateTerminal();
+  RefreshTerminal();
   endwin();
   static const char kPaletteReset[] = "\x1b]R";
   ssize_t written = write(1, kPaletteReset, 3);

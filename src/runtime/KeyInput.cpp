@@ -239,8 +239,7 @@ void HandleResize() {
   }
   resizeterm(size.ws_row, size.ws_col);
   Log(LOG_INFO, "Resized window to %dx%d", size.ws_col, size.ws_row);
-  wnoutrefresh(stdscr);
-  UpdateTerminal();
+  RefreshTerminal();
 }
 
 void SetLoggedIn(bool value) {

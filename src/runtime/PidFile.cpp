@@ -15,6 +15,7 @@
 #include "include/Constants.h"
 #include "runtime/HostPath.h"
 #include "runtime/SystemLog.h"
+#include "runtime/WriteAll.h"
 
 namespace Tulk {
 namespace {
@@ -40,21 +41,6 @@ long ReadPid(const std::string& path) {
   }
   text[got] = '\0';
   return ParsePid(text);
-}
-
-bool WriteAll(int fd, const std::string& text) {
-  std::size_t done = 0;
-  while (done < text.size()) {
-    const ssize_t written = write(fd, text.data() + done, text.size() - done);
-    if (written < 0 && errno == EINTR) {
-      continue;
-    }
-    if (written <= 0) {
-      return false;
-    }
-    done += static_cast<std::size_t>(written);
-  }
-  return true;
 }
 
 void ReplaceWithOwnPid(const std::string& path) {

@@ -2,7 +2,6 @@
 
 #include <curses.h>
 #include <fcntl.h>
-#include <poll.h>
 #include <sys/mman.h>
 #include <term.h>
 #include <unistd.h>
@@ -13,6 +12,7 @@
 #include <string>
 
 #include "runtime/AttributeFilter.h"
+#include "runtime/WriteAll.h"
 
 namespace Tulk {
 namespace {
@@ -114,25 +114,6 @@ void ReadUpdate() {
   (void)lseek(g_captureFd, 0, SEEK_SET);
 }
 
-// Writes all of `bytes` to the terminal, as curses' own flush does; gives
-// up when the terminal is gone.
-void WriteAll(int fd, const std::string& bytes) {
-  std::size_t done = 0;
-  while (done < bytes.size()) {
-    const ssize_t written = write(fd, bytes.data() + done, bytes.size() - done);
-    if (written > 0) {
-      done += static_cast<std::size_t>(written);
-    } else if (written < 0 && errno == EAGAIN) {
-      pollfd ready{fd, POLLOUT, 0};
-      (void)poll(&ready, 1, -1);
-    } else if (written < 0 && errno == EINTR) {
-      continue;
-    } else {
-      return;
-    }
-  }
-}
-
 }  // namespace
 
 FILE* OpenCursesOutput() {
@@ -182,7 +163,12 @@ void UpdateTerminal() {
   // update tries to point it back.
   const bool back = PointCursesAt(g_terminalFd);
   ReadUpdate();
-  WriteAll(back ? g_cursesFd : g_terminalFd, g_filter->Filter(g_update));
+  (void)WriteAll(back ? g_cursesFd : g_terminalFd, g_filter->Filter(g_update));
+}
+
+void RefreshTerminal() {
+  wnoutrefresh(stdscr);
+  UpdateTerminal();
 }
 
 void ForgetTerminalAttributes() {

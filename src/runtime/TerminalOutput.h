@@ -35,6 +35,10 @@ bool DescriptionSuitsFilter(bool& defaultColours);
 /// Sends curses' pending update (doupdate()), filtered where it is used.
 void UpdateTerminal();
 
+/// The whole screen's pending changes (wnoutrefresh(stdscr)), then
+/// UpdateTerminal(): what refresh() does, through the filter.
+void RefreshTerminal();
+
 /// Something other than an update wrote to the terminal (a program run in
 /// the foreground): the filter no longer knows its attributes.
 void ForgetTerminalAttributes();

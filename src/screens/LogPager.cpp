@@ -105,8 +105,7 @@ void ShowLogInPager(RuntimeFrame* screen, const std::string& path) {
   // the terminal with the cursor as it stood when the pager started.
   curs_set(1);
   clear();
-  wnoutrefresh(stdscr);
-  UpdateTerminal();
+  RefreshTerminal();
   RuntimeFrame* current = currentWindow;
   currentWindow = nullptr;
 
