@@ -14,7 +14,7 @@
 #include <vector>
 
 #include "ControlStream.h"
-#include "RenderingPair.h"
+#include "VirtualTerminal.h"
 #include "runtime/AttributeFilter.h"
 
 namespace {
@@ -38,21 +38,24 @@ extern "C" int LLVMFuzzerTestOneInput(const std::uint8_t* data, std::size_t size
 
   const std::vector<std::string> pieces = TulkTest::ControlStream(input, kRows, kCols);
   Tulk::AttributeFilter filter((cut & 1U) != 0);
-  TulkTest::RenderingPair pair(kRows, kCols);
+  TulkTest::VirtualTerminal original(kRows, kCols);
+  TulkTest::VirtualTerminal filtered(kRows, kCols);
   std::size_t at = 0;
-  for (unsigned update = 0; at < pieces.size(); ++update) {
-    std::string original;
-    for (std::size_t count = 1 + ((cut >> 1) + update * 7) % 9; count > 0 && at < pieces.size();
+  for (unsigned number = 0; at < pieces.size(); ++number) {
+    std::string update;
+    for (std::size_t count = 1 + ((cut >> 1) + number * 7) % 9; count > 0 && at < pieces.size();
          --count) {
-      original += pieces[at++];
+      update += pieces[at++];
     }
-    pair.Feed(original, filter.Filter(original));
-    if (std::string difference = pair.Difference(); !difference.empty()) {
+    original.Write(update);
+    filtered.Write(filter.Filter(update));
+    if (std::string difference = original.Difference(filtered); !difference.empty()) {
       Fail(difference);
     }
   }
-  pair.Feed("lqk", filter.Filter("lqk"));
-  if (std::string difference = pair.Difference(); !difference.empty()) {
+  original.Write("lqk");
+  filtered.Write(filter.Filter("lqk"));
+  if (std::string difference = original.Difference(filtered); !difference.empty()) {
     Fail("the character set: " + difference);
   }
 

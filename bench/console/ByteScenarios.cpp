@@ -5,6 +5,7 @@
 #include <cstdlib>
 
 #include "BenchConsole.h"
+#include "KeyNames.h"
 #include "ScratchFolder.h"
 
 namespace TulkBench {
@@ -39,19 +40,8 @@ Screen Picture(const TulkTest::TestConsole& console, const TerminalProfile& prof
 // cells that changed, on standard error.
 void Trace(const std::string& key, const Change& change, const std::string& bytes,
            const Screen& before, const Screen& after) {
-  std::string escaped;
-  for (char ch : bytes) {
-    const auto code = static_cast<unsigned char>(ch);
-    if (code < 32 || code >= 127) {
-      char hex[8];
-      (void)std::snprintf(hex, sizeof hex, "\\x%02x", code);
-      escaped += hex;
-    } else {
-      escaped += ch;
-    }
-  }
   (void)std::fprintf(stderr, "key %s: %g bytes, fewest %g\n  %s\n", key.c_str(), change.bytes,
-                     change.fewest, escaped.c_str());
+                     change.fewest, TulkTest::VisibleBytes(bytes).c_str());
   for (int row = 0; row < kRows; ++row) {
     for (int col = 0; col < kCols; ++col) {
       const TulkTest::Cell& a = before.At(row, col);

@@ -1,7 +1,6 @@
 #include "ControlStream.h"
 
 #include <array>
-#include <utility>
 
 namespace TulkTest {
 namespace {
@@ -36,8 +35,69 @@ std::string Sgr(Reader& in) {
   return control + "m";
 }
 
-std::string Csi(const std::string& parameters, char final) {
-  return "\x1b[" + parameters + final;
+// The controls a choice picks among, by choice; empty for those built from
+// later bytes (text, SGR, moves).
+const std::array<std::vector<std::string>, 16>& Choices() {
+  static const std::array<std::vector<std::string>, 16> kChoices = {{
+      {},
+      // A Unicode line character, which curses writes outside the
+      // line-drawing set only. (libvterm does not translate ASCII that
+      // follows other UTF-8 in the same write through the set.)
+      {"\x1b(B\u2502", "\x1b(B\u2510"},
+      {},
+      {},
+      // Curses' combined attribute control: a designation and a reset.
+      {"\x1b(0\x1b[0m", "\x1b(B\x1b[m"},
+      {"\x1b(0", "\x1b(B"},
+      {"\x0e", "\x0f"},
+      {},
+      {"\x1b[K", "\x1b[1K", "\x1b[2K", "\x1b[J", "\x1b[4X", "\x1b[M", "\x1b[L", "\x1b[2@",
+       "\x1b[P"},
+      {"\n"},
+      {"\x1b[?25l", "\x1b[?25h", "\x1b[?7h", "\x1b[?1049h", "\x1b[?1049l", "\x1b[?6h"},
+      {"\x1b"
+       "7",
+       "\x1b"
+       "8",
+       "\x1b[s", "\x1b[u"},
+      {"\x1b]2;\x1b[31mtitle\a", "\x1b]4;1;rgb:ff/00/00\x1b\\"},
+      {"x\x1b[3b", "\t"},
+      {"\x1b[!p",
+       "\x1b"
+       "c"},
+      {"\r\n"},
+  }};
+  return kChoices;
+}
+
+std::string Text(Reader& in) {
+  static constexpr char kText[] = "abq xlkjm-|";
+  std::string text;
+  for (int count = 1 + in.Below(8); count > 0; --count) {
+    text += kText[in.Below(sizeof kText - 1)];
+  }
+  return text;
+}
+
+std::string Move(Reader& in, int rows, int cols) {
+  const std::string row = std::to_string(1 + in.Below(rows));
+  const std::string col = std::to_string(1 + in.Below(cols));
+  switch (in.Below(7)) {
+    case 0:
+      return "\x1b[" + row + ";" + col + "H";
+    case 1:
+      return "\x1b[" + col + "G";
+    case 2:
+      return "\x1b[" + row + "d";
+    case 3:
+      return "\x1b[" + std::to_string(in.Below(5)) + "C";
+    case 4:
+      return "\x1b[" + std::to_string(in.Below(5)) + "D";
+    case 5:
+      return "\r";
+    default:
+      return "\b";
+  }
 }
 
 }  // namespace
@@ -46,91 +106,19 @@ std::vector<std::string> ControlStream(std::string_view choices, int rows, int c
   Reader in(choices);
   std::vector<std::string> pieces;
   while (in.More()) {
-    std::string out;
-    switch (in.Below(16)) {
-      case 0: {
-        static constexpr char kText[] = "abq xlkjm-|";
-        const int count = 1 + in.Below(8);
-        for (int i = 0; i < count; ++i) {
-          out += kText[in.Below(sizeof kText - 1)];
-        }
-        break;
-      }
-      case 1:
-        // A Unicode line character, which curses writes outside the
-        // line-drawing set only. (libvterm does not translate ASCII that
-        // follows other UTF-8 in the same write through the set.)
-        out += in.Below(2) == 0 ? "\x1b(B\u2502" : "\x1b(B\u2510";
-        break;
-      case 2:
-      case 3:
-        out += Sgr(in);
-        break;
-      case 4:
-        // Curses' combined attribute control: a designation and a reset.
-        out += in.Below(2) == 0 ? "\x1b(0\x1b[0m" : "\x1b(B\x1b[m";
-        break;
-      case 5:
-        out += in.Below(2) == 0 ? "\x1b(0" : "\x1b(B";
-        break;
-      case 6:
-        out += in.Below(2) == 0 ? "\x0e" : "\x0f";
-        break;
-      case 7: {
-        const std::string row = std::to_string(1 + in.Below(rows));
-        const std::string col = std::to_string(1 + in.Below(cols));
-        static constexpr std::array<const char*, 7> kMoves = {"H", "G", "d", "C", "D", "\r", "\b"};
-        const std::string move = kMoves[static_cast<std::size_t>(in.Below(kMoves.size()))];
-        out += move == "H"   ? Csi(row + ";" + col, 'H')
-               : move == "G" ? Csi(col, 'G')
-               : move == "d" ? Csi(row, 'd')
-               : move == "C" ? Csi(std::to_string(in.Below(5)), 'C')
-               : move == "D" ? Csi(std::to_string(in.Below(5)), 'D')
-                             : move;
-        break;
-      }
-      case 8: {
-        static constexpr std::array<const char*, 9> kErases = {"\x1b[K", "\x1b[1K", "\x1b[2K",
-                                                               "\x1b[J", "\x1b[4X", "\x1b[M",
-                                                               "\x1b[L", "\x1b[2@", "\x1b[P"};
-        out += kErases[static_cast<std::size_t>(in.Below(kErases.size()))];
-        break;
-      }
-      case 9:
-        out += "\n";
-        break;
-      case 10: {
-        static constexpr std::array<const char*, 6> kModes = {
-            "\x1b[?25l", "\x1b[?25h", "\x1b[?7h", "\x1b[?1049h", "\x1b[?1049l", "\x1b[?6h"};
-        out += kModes[static_cast<std::size_t>(in.Below(kModes.size()))];
-        break;
-      }
-      case 11: {
-        static constexpr std::array<const char*, 4> kSaves = {
-            "\x1b"
-            "7",
-            "\x1b"
-            "8",
-            "\x1b[s", "\x1b[u"};
-        out += kSaves[static_cast<std::size_t>(in.Below(kSaves.size()))];
-        break;
-      }
-      case 12:
-        out += in.Below(2) == 0 ? "\x1b]2;\x1b[31mtitle\a" : "\x1b]4;1;rgb:ff/00/00\x1b\\";
-        break;
-      case 13:
-        out += in.Below(2) == 0 ? "x\x1b[3b" : "\t";
-        break;
-      case 14:
-        out += in.Below(2) == 0 ? "\x1b[!p"
-                                : "\x1b"
-                                  "c";
-        break;
-      default:
-        out += "\r\n";
-        break;
+    const int choice = in.Below(16);
+    const std::vector<std::string>& fixed = Choices()[static_cast<std::size_t>(choice)];
+    if (choice == 0) {
+      pieces.push_back(Text(in));
+    } else if (choice == 2 || choice == 3) {
+      pieces.push_back(Sgr(in));
+    } else if (choice == 7) {
+      pieces.push_back(Move(in, rows, cols));
+    } else if (fixed.size() == 1) {
+      pieces.push_back(fixed[0]);
+    } else {
+      pieces.push_back(fixed[static_cast<std::size_t>(in.Below(static_cast<int>(fixed.size())))]);
     }
-    pieces.push_back(std::move(out));
   }
   return pieces;
 }

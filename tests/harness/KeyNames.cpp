@@ -1,5 +1,6 @@
 #include "KeyNames.h"
 
+#include <cstdio>
 #include <map>
 #include <stdexcept>
 
@@ -20,6 +21,21 @@ std::string KeyBytes(std::string_view name) {
     throw std::invalid_argument("unknown key name: " + std::string(name));
   }
   return found->second;
+}
+
+std::string VisibleBytes(std::string_view bytes) {
+  std::string text;
+  for (char c : bytes) {
+    const auto byte = static_cast<unsigned char>(c);
+    if (byte >= 0x20 && byte < 0x7f) {
+      text += c;
+    } else {
+      char hex[8];
+      (void)std::snprintf(hex, sizeof hex, "\\x%02x", byte);
+      text += hex;
+    }
+  }
+  return text;
 }
 
 }  // namespace TulkTest

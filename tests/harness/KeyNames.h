@@ -14,4 +14,8 @@ namespace TulkTest {
 /// The bytes of the key; throws std::invalid_argument for an unknown name.
 std::string KeyBytes(std::string_view name);
 
+/// `bytes` for a test message: printable ASCII as it is, every other byte
+/// as "\xNN".
+std::string VisibleBytes(std::string_view bytes);
+
 }  // namespace TulkTest

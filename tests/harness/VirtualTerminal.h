@@ -50,6 +50,13 @@ class VirtualTerminal {
   /// Bytes the terminal answers with (replies to queries), taken out.
   std::string TakeReplies();
 
+  /// Empty when `other` shows the same cells (characters, colours and
+  /// every attribute libvterm keeps), has the cursor in the same place and
+  /// would give a character written next the same attributes; otherwise
+  /// the first difference, described. The attribute filter's tests compare
+  /// what curses wrote with what the filter made of it this way.
+  std::string Difference(const VirtualTerminal& other) const;
+
  private:
   friend struct VirtualTerminalCallbacks;
 

@@ -19,6 +19,7 @@
 #include <string>
 #include <vector>
 
+#include "KeyNames.h"
 #include "ProcessHygiene.h"
 #include "ReliabilitySupport.h"
 #include "ScreenTestSupport.h"
@@ -141,7 +142,8 @@ class RandomInput {
       }
       if (!console_->Running()) {
         const std::optional<int> status = console_->WaitExit();
-        ASSERT_EQ(status, 0) << "the console ended after the keys " << Printable(burst) << "\n"
+        ASSERT_EQ(status, 0) << "the console ended after the keys " << TulkTest::VisibleBytes(burst)
+                             << "\n"
                              << console_->Dump();
         ASSERT_TRUE(Reliability::TerminalGivenBack(*console_, ""));
         ++figures_.documentedEnds;
@@ -158,7 +160,7 @@ class RandomInput {
         continue;
       }
       FAIL() << "no answer within " << std::chrono::duration<double>(kAnswer).count()
-             << " s to the keys " << Printable(burst) << "\n"
+             << " s to the keys " << TulkTest::VisibleBytes(burst) << "\n"
              << console_->Dump();
     }
     FAIL() << "the pager could not be left\n" << console_->Dump();
@@ -183,16 +185,6 @@ class RandomInput {
       EXPECT_TRUE(Reliability::TerminalGivenBack(*console_, ""));
     }
     console_.reset();
-  }
-
-  static std::string Printable(const std::string& bytes) {
-    std::string text;
-    for (unsigned char byte : bytes) {
-      char hex[5];
-      std::snprintf(hex, sizeof hex, "\\x%02x", byte);
-      text += (byte >= 0x20 && byte < 0x7f) ? std::string(1, static_cast<char>(byte)) : hex;
-    }
-    return text;
   }
 
   std::string place_;

@@ -9,25 +9,14 @@
 #include <vector>
 
 #include "ControlStream.h"
-#include "RenderingPair.h"
+#include "KeyNames.h"
+#include "VirtualTerminal.h"
 #include "runtime/TerminalOutput.h"
 
 namespace Tulk {
 namespace {
 
-std::string Escaped(const std::string& bytes) {
-  std::string text;
-  for (unsigned char c : bytes) {
-    if (c < 0x20 || c == 0x7f) {
-      char code[8];
-      (void)std::snprintf(code, sizeof code, "\\x%02x", c);
-      text += code;
-    } else {
-      text += static_cast<char>(c);
-    }
-  }
-  return text;
-}
+using TulkTest::VisibleBytes;
 
 struct FilterCase {
   const char* name;
@@ -92,7 +81,7 @@ TEST(AttributeFilterTest, SendsWhatChangesOnce) {
   for (const FilterCase& test : cases) {
     AttributeFilter filter(test.defaultColours);
     for (std::size_t i = 0; i < test.updates.size(); ++i) {
-      EXPECT_EQ(Escaped(filter.Filter(test.updates[i])), Escaped(test.sent[i]))
+      EXPECT_EQ(VisibleBytes(filter.Filter(test.updates[i])), VisibleBytes(test.sent[i]))
           << test.name << ", update " << i;
     }
   }
@@ -101,16 +90,16 @@ TEST(AttributeFilterTest, SendsWhatChangesOnce) {
 TEST(AttributeFilterTest, ReadsOnlyAttributeControls) {
   for (const char* understood :
        {"\x1b(B\x1b[m", "\x1b[m\x0f$<2>", "\x1b[0;10;1;7m\x0e", "\x1b[38;5;200m", "\x1b[39;49m"}) {
-    EXPECT_TRUE(AttributeFilter::Understands(understood)) << Escaped(understood);
+    EXPECT_TRUE(AttributeFilter::Understands(understood)) << VisibleBytes(understood);
   }
   for (const char* foreign : {"\x1b[?5h$<100/>\x1b[?5l", "\x1b[3:1m", "\x1b[1;2H", "\x1b&dB", "abc",
                               "\x1b[4", "\x1b[21m", "\x1b[>4;1m"}) {
-    EXPECT_FALSE(AttributeFilter::Understands(foreign)) << Escaped(foreign);
+    EXPECT_FALSE(AttributeFilter::Understands(foreign)) << VisibleBytes(foreign);
   }
   EXPECT_TRUE(AttributeFilter::SetsDefaultColours("\x1b[39;49m"));
   EXPECT_TRUE(AttributeFilter::SetsDefaultColours("\x1b[49;39m"));
   for (const char* other : {"\x1b[39m", "\x1b[0m", "\x1b[39;49m\x1b[m", "\x1b[39;49;1m"}) {
-    EXPECT_FALSE(AttributeFilter::SetsDefaultColours(other)) << Escaped(other);
+    EXPECT_FALSE(AttributeFilter::SetsDefaultColours(other)) << VisibleBytes(other);
   }
 }
 
@@ -147,7 +136,8 @@ TEST(AttributeFilterTest, FilteredUpdatesLookTheSame) {
     }
     const std::vector<std::string> pieces = TulkTest::ControlStream(choices, kRows, kCols);
     AttributeFilter filter(run % 2 == 0);
-    TulkTest::RenderingPair pair(kRows, kCols);
+    TulkTest::VirtualTerminal original(kRows, kCols);
+    TulkTest::VirtualTerminal filtered(kRows, kCols);
     std::string all;
     for (std::size_t at = 0; at < pieces.size();) {
       std::string update;
@@ -156,12 +146,15 @@ TEST(AttributeFilterTest, FilteredUpdatesLookTheSame) {
       }
       const std::string sent = filter.Filter(update);
       all += update;
-      pair.Feed(update, sent);
-      ASSERT_EQ(pair.Difference(), "")
-          << "run " << run << ": " << Escaped(all) << "\nlast update sent as " << Escaped(sent);
+      original.Write(update);
+      filtered.Write(sent);
+      ASSERT_EQ(original.Difference(filtered), "")
+          << "run " << run << ": " << VisibleBytes(all) << "\nlast update sent as "
+          << VisibleBytes(sent);
     }
-    pair.Feed("lqk", filter.Filter("lqk"));
-    ASSERT_EQ(pair.Difference(), "") << "run " << run << ": " << Escaped(all);
+    original.Write("lqk");
+    filtered.Write(filter.Filter("lqk"));
+    ASSERT_EQ(original.Difference(filtered), "") << "run " << run << ": " << VisibleBytes(all);
   }
 }
 
